@@ -1,0 +1,110 @@
+#pragma once
+#include <cstdint>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <unordered_map>
+#include <vector>
+
+namespace qv {
+
+// The game item and, at the same time, a keyed collection of further items in insertion order.
+// Library entries, game records, the resolution cycle and the update list are all MyClass
+// items; a collection's own fields stay empty and an item's own collection stays empty.
+// Keys ignore ASCII letter case.
+class MyClass {
+public:
+    std::string RomFile;
+    std::string Title;
+    std::string Notes;
+    bool Working = false;
+    bool Mouse = false;
+    std::string Year;
+    std::string Company;
+    std::string Rating;
+    std::string Categories;
+    bool Hidden = false;
+    bool EmuWorking = false;
+    bool EmuColors = false;
+    bool EmuSound = false;
+    bool EmuScreenFlip = false;
+    std::int64_t FileSize = 0;  // archives over 2 GB exist
+    bool Present = false;
+    std::int16_t Plays = 0;
+    std::string LastPlayed;
+    std::string Category;
+    std::string MameVersion;
+    std::string Extra;
+    std::string Resolution;
+    std::int32_t PlaySeconds = 0;
+
+    MyClass() = default;
+    MyClass(const MyClass&) = delete;
+    MyClass& operator=(const MyClass&) = delete;
+    MyClass(MyClass&&) noexcept = default;
+    MyClass& operator=(MyClass&&) noexcept = default;
+
+    // Set once: the first assignment stores the key, later ones are ignored.
+    const std::string& Key() const { return key_; }
+    void SetKey(std::string key);
+
+    std::int32_t Count() const { return static_cast<std::int32_t>(items_.size()); }
+
+    // Removes by key or by 1-based position; throws std::out_of_range when there is none.
+    void Delete(std::string_view key);
+    void Delete(std::int32_t position);
+
+    // The item by key or 1-based position, or nullptr.
+    MyClass* Item(std::string_view key);
+    const MyClass* Item(std::string_view key) const;
+    MyClass* Item(std::int32_t position);
+    const MyClass* Item(std::int32_t position) const;
+    MyClass* Item(const char* key) { return Item(std::string_view(key)); }
+    const MyClass* Item(const char* key) const { return Item(std::string_view(key)); }
+    MyClass* Item(const std::string& key) { return Item(std::string_view(key)); }
+    const MyClass* Item(const std::string& key) const { return Item(std::string_view(key)); }
+
+    bool exists(std::string_view key) const { return Item(key) != nullptr; }
+    bool exists(std::int32_t position) const { return Item(position) != nullptr; }
+
+    // A new item under the key, or nullptr (and nothing added) when the key is taken.
+    MyClass* Add(std::string key);
+
+    // Empties the collection.
+    void Clear();
+    void Reserve(std::size_t count);
+
+    // Enumeration in insertion order (NewEnum).
+    template <typename Item, typename Inner>
+    class BasicIterator {
+    public:
+        explicit BasicIterator(Inner it) : it_(it) {}
+        Item& operator*() const { return **it_; }
+        Item* operator->() const { return it_->get(); }
+        BasicIterator& operator++() { ++it_; return *this; }
+        bool operator==(const BasicIterator& other) const { return it_ == other.it_; }
+        bool operator!=(const BasicIterator& other) const { return it_ != other.it_; }
+    private:
+        Inner it_;
+    };
+    using Items = std::vector<std::unique_ptr<MyClass>>;
+    using iterator = BasicIterator<MyClass, Items::iterator>;
+    using const_iterator = BasicIterator<const MyClass, Items::const_iterator>;
+    iterator begin() { return iterator(items_.begin()); }
+    iterator end() { return iterator(items_.end()); }
+    const_iterator begin() const { return const_iterator(items_.cbegin()); }
+    const_iterator end() const { return const_iterator(items_.cend()); }
+
+    // Case-folded form of a key, as used for lookups.
+    static std::string FoldKey(std::string_view key);
+
+private:
+    void ReindexFrom(std::size_t first);
+
+    std::string key_;
+    bool keySet_ = false;
+    Items items_;
+    std::unordered_map<std::string, std::size_t> index_;  // folded key -> position (0-based)
+};
+
+}  // namespace qv
