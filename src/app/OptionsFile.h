@@ -27,7 +27,7 @@ std::string WriteOptions(const Options& options, const std::filesystem::path& co
                          const HostConventions& host, const Regional& regional,
                          const Clock& clock, ActivityLog& log);
 
-// The lines WriteOptions writes (without line ends), for callers that only need the text.
+// The text WriteOptions writes (CR LF after every line), for callers that only need the text.
 std::string OptionsFileText(const Options& options, const HostConventions& host,
                             const std::string& updatedText);
 
