@@ -1,0 +1,319 @@
+#include "catalogue/GameTreeBuilder.h"
+
+#include <gtest/gtest.h>
+
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "support/TempDir.h"
+
+namespace qv {
+namespace {
+
+class RecordingStatus final : public StatusDisplay {
+public:
+    bool IsVisible() const override { return visible; }
+    void SetStatus(const std::string& text) override { texts.push_back(text); }
+    bool visible = true;
+    std::vector<std::string> texts;
+};
+
+class GameTreeBuilderTest : public ::testing::Test {
+protected:
+    MyClass& Record(const std::string& romFile, const std::string& title, bool working = true,
+                    bool present = true) {
+        MyClass& record = *records.Add(romFile);
+        record.RomFile = romFile;
+        record.Title = title;
+        record.Working = working;
+        record.Present = present;
+        return record;
+    }
+    MyClass& Entry(const std::string& romFile, const std::string& title,
+                   const std::string& category) {
+        MyClass& entry = *library.Add(romFile);
+        entry.RomFile = romFile;
+        entry.Title = title;
+        entry.Category = category;
+        return entry;
+    }
+    void Build() { BuildGameTree(tree, records, library, options, SnapshotIndex(snap.path().string())); }
+    const TreeNode& NodeOf(const std::string& key) const {
+        const NodeId id = tree.Find(key);
+        EXPECT_NE(id, NoNode) << key;
+        static const TreeNode missing{};
+        return id == NoNode ? missing : tree.Node(id);
+    }
+
+    test::TempDir snap;
+    MyClass records;
+    MyClass library;
+    Options options;
+    GameTree tree;
+};
+
+TEST_F(GameTreeBuilderTest, SnapshotIndexListsFolderOnceAndMissingFolderIsEmpty) {
+    snap.Write("pacman.png", "png");
+    snap.Write("sub/galaga.png", "png");  // not in the folder itself
+    std::filesystem::create_directories(snap / "folder.png");  // a folder, not a screenshot
+    const SnapshotIndex index(snap.path().string());
+    EXPECT_TRUE(index.Has("pacman.png"));
+    EXPECT_FALSE(index.Has("PACMAN.png"));
+    EXPECT_FALSE(index.Has("galaga.png"));
+    EXPECT_FALSE(index.Has("folder.png"));
+
+    const SnapshotIndex missing((snap / "nope").string());
+    EXPECT_FALSE(missing.Has("pacman.png"));
+    EXPECT_EQ(SnapshotIndex::PngName("pacman.zip"), "pacman.png");
+    EXPECT_EQ(SnapshotIndex::PngName("PacMan.ZIP"), "PacMan.ZIP");  // the marker is exact
+}
+
+TEST_F(GameTreeBuilderTest, RootsCarryKeysTextsImagesAndChildCounts) {
+    Entry("pacman.zip", "Pac-Man", "Maze");
+    Entry("dkong.zip", "Donkey Kong", "Maze");
+    Entry("galaga.zip", "Galaga", "Shooter");
+    Entry("mystery.zip", "Mystery", "");
+    Record("pacman.zip", "Pac-Man");
+    Record("dkong.zip", "Donkey Kong");
+    Record("mystery.zip", "Mystery");
+    Build();
+
+    EXPECT_EQ(NodeOf("alpha_").Text, " Alphabetical (3)");
+    EXPECT_EQ(NodeOf("alpha_").Image, "fclosed");
+    EXPECT_EQ(NodeOf("alpha_").ExpandedImage, "fopen");
+    EXPECT_EQ(NodeOf("Maze_").Text, "Maze (2)");
+    EXPECT_EQ(NodeOf("Maze_").Image, "fclosed");
+    EXPECT_EQ(NodeOf("Maze_").ExpandedImage, "fopen");
+    // No record of Galaga, and Mystery has no category: no further roots.
+    EXPECT_EQ(tree.Find("Shooter_"), NoNode);
+    EXPECT_EQ(tree.ChildCount(NoNode), 2);
+    EXPECT_EQ(tree.Count(), 2 + 3 + 2);
+
+    // The leading space puts the alphabetical root first; children are sorted by title.
+    EXPECT_EQ(tree.Node(tree.Children(NoNode)[0]).Key, "alpha_");
+    std::vector<std::string> titles;
+    for (const NodeId id : tree.Children(tree.Find("alpha_"))) titles.push_back(tree.Node(id).Text);
+    EXPECT_EQ(titles, (std::vector<std::string>{"Donkey Kong", "Mystery", "Pac-Man"}));
+
+    const TreeNode& game = NodeOf("Maze_pacman.zip");
+    EXPECT_EQ(game.Text, "Pac-Man");
+    EXPECT_EQ(game.Tag, "pacman.zip");
+    EXPECT_EQ(game.Parent, tree.Find("Maze_"));
+    EXPECT_TRUE(game.ExpandedImage.empty());
+    EXPECT_EQ(NodeOf("alpha_pacman.zip").Parent, tree.Find("alpha_"));
+}
+
+TEST_F(GameTreeBuilderTest, GameColoursFollowWorkingPresentAndScreenshot) {
+    snap.Write("pacman.png", "png");
+    Entry("pacman.zip", "Pac-Man", "Maze");
+    MyClass& pacman = Record("pacman.zip", "Pac-Man");
+    Record("galaga.zip", "Galaga");
+    Record("dkong.zip", "Donkey Kong", /*working=*/false);
+    Build();
+
+    EXPECT_EQ(NodeOf("alpha_pacman.zip").Colour, colours::Black);
+    EXPECT_EQ(NodeOf("alpha_pacman.zip").Image, "good");
+    EXPECT_EQ(NodeOf("Maze_pacman.zip").Colour, colours::Black);
+    EXPECT_EQ(NodeOf("alpha_galaga.zip").Colour, colours::LightBlue);
+    EXPECT_EQ(NodeOf("alpha_galaga.zip").Image, "good");
+    EXPECT_EQ(NodeOf("alpha_dkong.zip").Colour, colours::Red);
+    EXPECT_EQ(NodeOf("alpha_dkong.zip").Image, "bad");
+
+    // The archive goes missing: grey, "bad", and the record is now not working.
+    pacman.Present = false;
+    Build();
+    EXPECT_EQ(NodeOf("alpha_pacman.zip").Colour, colours::Grey);
+    EXPECT_EQ(NodeOf("alpha_pacman.zip").Image, "bad");
+    EXPECT_EQ(NodeOf("Maze_pacman.zip").Colour, colours::Grey);
+    EXPECT_FALSE(pacman.Working);
+}
+
+TEST_F(GameTreeBuilderTest, ScreenshotNameKeepsTheRecordsCase) {
+    snap.Write("pacman.png", "png");
+    Record("PacMan.zip", "Pac-Man");
+    Build();
+    EXPECT_EQ(NodeOf("alpha_PacMan.zip").Colour, colours::LightBlue);
+}
+
+TEST_F(GameTreeBuilderTest, HiddenAndWorkingFilters) {
+    Entry("pacman.zip", "Pac-Man", "Maze");
+    Entry("hidden.zip", "Hidden Game", "Maze");
+    Entry("broken.zip", "Broken Game", "Maze");
+    Record("pacman.zip", "Pac-Man");
+    Record("hidden.zip", "Hidden Game").Hidden = true;
+    Record("broken.zip", "Broken Game", /*working=*/false);
+
+    Build();
+    EXPECT_EQ(tree.Find("alpha_hidden.zip"), NoNode);
+    EXPECT_EQ(tree.Find("Maze_hidden.zip"), NoNode);
+    EXPECT_NE(tree.Find("Maze_broken.zip"), NoNode);
+    EXPECT_EQ(NodeOf("Maze_").Text, "Maze (2)");
+
+    options.ShowHidden = true;
+    Build();
+    EXPECT_NE(tree.Find("alpha_hidden.zip"), NoNode);
+    EXPECT_NE(tree.Find("Maze_hidden.zip"), NoNode);
+
+    options.ShowWorking = true;
+    Build();
+    EXPECT_EQ(tree.Find("alpha_broken.zip"), NoNode);
+    EXPECT_EQ(tree.Find("Maze_broken.zip"), NoNode);
+    EXPECT_NE(tree.Find("alpha_pacman.zip"), NoNode);
+    EXPECT_EQ(NodeOf("alpha_").Text, " Alphabetical (2)");
+}
+
+TEST_F(GameTreeBuilderTest, UnidentifiedArchiveSurvivesFiltersUnderAlphabeticalOnly) {
+    options.ShowWorking = true;
+    // Still named by its file: the library does not know it, so it has no category either.
+    MyClass& unknown = Record("unknown.zip", "unknown.zip", /*working=*/false);
+    unknown.Hidden = true;
+    Build();
+    EXPECT_EQ(NodeOf("alpha_unknown.zip").Text, "unknown.zip");
+    EXPECT_EQ(NodeOf("alpha_unknown.zip").Colour, colours::Red);
+    EXPECT_EQ(tree.ChildCount(NoNode), 1);
+}
+
+TEST_F(GameTreeBuilderTest, RemovedRecordsAreNeverShown) {
+    options.ShowHidden = true;
+    Entry("pacman.zip", "Pac-Man", "Maze");
+    MyClass& removed = *records.Add("pacman.zip");
+    removed.RomFile = "^pacman.zip";
+    removed.Title = "^pacman.zip";  // even an unidentified one
+    removed.Present = true;
+    Build();
+    EXPECT_EQ(tree.Count(), 1);
+    EXPECT_EQ(NodeOf("alpha_").Text, " Alphabetical (0)");
+}
+
+TEST_F(GameTreeBuilderTest, RebuildReplacesEverythingIncludingAllGamesRoot) {
+    Entry("pacman.zip", "Pac-Man", "Maze");
+    Record("pacman.zip", "Pac-Man");
+    Build();
+    RecordingStatus status;
+    NoEventYield yield;
+    ASSERT_TRUE(AddAllEmulatedGames(tree, library, records, SnapshotIndex(), status, yield));
+    EXPECT_NE(tree.Find("MAME.ROMS"), NoNode);
+    Build();
+    EXPECT_EQ(tree.Find("MAME.ROMS"), NoNode);
+    EXPECT_EQ(NodeOf("Maze_").Text, "Maze (1)");  // counted once, not " (1) (1)"
+}
+
+TEST_F(GameTreeBuilderTest, GameFileNameEndingInUnderscoreIsNotCountedAsRoot) {
+    Record("odd_", "Odd Game");
+    Build();
+    EXPECT_EQ(NodeOf("alpha_odd_").Text, "Odd Game");
+}
+
+TEST_F(GameTreeBuilderTest, AddGameNodeIgnoresEmptyGroupAndDuplicates) {
+    const SnapshotIndex none;
+    AddGameNode(tree, none, "", "pacman.zip", "Pac-Man", true, true);
+    EXPECT_EQ(tree.Count(), 0);
+
+    AddGameNode(tree, none, "Maze", "pacman.zip", "Pac-Man", true, true);
+    AddGameNode(tree, none, "maze", "PACMAN.ZIP", "Other", false, false);
+    EXPECT_EQ(tree.Count(), 2);
+    EXPECT_EQ(NodeOf("Maze_").Text, "Maze");  // the root is created without a count
+    EXPECT_EQ(NodeOf("Maze_pacman.zip").Text, "Pac-Man");
+    EXPECT_EQ(NodeOf("Maze_pacman.zip").Colour, colours::LightBlue);
+}
+
+TEST_F(GameTreeBuilderTest, AllGamesNodesColouredByOwnershipAndScreenshot) {
+    snap.Write("pacman.png", "png");
+    snap.Write("galaga.png", "png");
+    Entry("PACMAN.zip", "Pac-Man", "Maze");   // lower-cased for the screenshot name
+    Entry("galaga.zip", "Galaga", "Shooter");
+    Entry("dkong.zip", "Donkey Kong", "Maze");
+    Entry("mspacman.zip", "Ms. Pac-Man", "Maze");
+    Entry("frogger.zip", "Frogger", "Maze");
+    Record("PACMAN.zip", "Pac-Man");                                  // owned, present, shot
+    Record("dkong.zip", "Donkey Kong");                               // owned, present, no shot
+    Record("mspacman.zip", "Ms. Pac-Man", true, /*present=*/false);  // owned, missing
+    RecordingStatus status;
+    NoEventYield yield;
+    ASSERT_TRUE(AddAllEmulatedGames(tree, library, records, SnapshotIndex(snap.path().string()),
+                                    status, yield));
+
+    const TreeNode& root = NodeOf("MAME.ROMS");
+    EXPECT_EQ(root.Text, "All MAME ROMs");
+    EXPECT_EQ(root.Image, "fclosed");
+    EXPECT_EQ(root.ExpandedImage, "fopen");
+    EXPECT_EQ(tree.ChildCount(tree.Find("MAME.ROMS")), 5);
+
+    EXPECT_EQ(NodeOf("MAME.ROMS_PACMAN.zip").Colour, colours::Black);
+    EXPECT_EQ(NodeOf("MAME.ROMS_PACMAN.zip").Image, "good");
+    EXPECT_EQ(NodeOf("MAME.ROMS_PACMAN.zip").Tag, "PACMAN.zip");
+    EXPECT_EQ(NodeOf("MAME.ROMS_dkong.zip").Colour, colours::LightBlue);
+    EXPECT_EQ(NodeOf("MAME.ROMS_dkong.zip").Image, "good");
+    EXPECT_EQ(NodeOf("MAME.ROMS_mspacman.zip").Colour, colours::Grey);
+    EXPECT_EQ(NodeOf("MAME.ROMS_mspacman.zip").Image, "");
+    EXPECT_EQ(NodeOf("MAME.ROMS_galaga.zip").Colour, colours::Blue);
+    EXPECT_EQ(NodeOf("MAME.ROMS_galaga.zip").Image, "bad");
+    EXPECT_EQ(NodeOf("MAME.ROMS_frogger.zip").Colour, colours::Grey);
+    EXPECT_EQ(NodeOf("MAME.ROMS_frogger.zip").Image, "bad");
+    EXPECT_TRUE(status.texts.empty());  // fewer than 100 entries: no progress
+    EXPECT_EQ(yield.yields, 0);
+}
+
+TEST_F(GameTreeBuilderTest, AllGamesRootIsAddedOnlyOnce) {
+    Entry("pacman.zip", "Pac-Man", "Maze");
+    NoStatusDisplay status;
+    NoEventYield yield;
+    EXPECT_TRUE(AddAllEmulatedGames(tree, library, records, SnapshotIndex(), status, yield));
+    const auto count = tree.Count();
+    EXPECT_FALSE(AddAllEmulatedGames(tree, library, records, SnapshotIndex(), status, yield));
+    EXPECT_EQ(tree.Count(), count);
+    EXPECT_EQ(tree.ChildCount(NoNode), 1);
+}
+
+TEST_F(GameTreeBuilderTest, AllGamesReportsProgressEveryHundredEntries) {
+    for (int i = 0; i < 250; ++i) Entry("g" + std::to_string(i) + ".zip", "Game", "Maze");
+    RecordingStatus status;
+    NoEventYield yield;
+    AddAllEmulatedGames(tree, library, records, SnapshotIndex(), status, yield);
+    EXPECT_EQ(status.texts, (std::vector<std::string>{"Adding all MAME ROMs ... 40%",
+                                                      "Adding all MAME ROMs ... 80%"}));
+    EXPECT_EQ(yield.yields, 2);
+    EXPECT_EQ(tree.ChildCount(tree.Find("MAME.ROMS")), 250);
+
+    // With the wait window closed the events still run, but no status is set.
+    GameTree other;
+    RecordingStatus hidden;
+    hidden.visible = false;
+    AddAllEmulatedGames(other, library, records, SnapshotIndex(), hidden, yield);
+    EXPECT_TRUE(hidden.texts.empty());
+    EXPECT_EQ(yield.yields, 4);
+}
+
+// A window event during the yield rebuilds the tree; the fill must stop rather than add
+// nodes under whatever node now has the old root's id.
+class RebuildingYield final : public EventYield {
+public:
+    explicit RebuildingYield(std::function<void()> onYield) : onYield_(std::move(onYield)) {}
+    void Yield() override { onYield_(); }
+private:
+    std::function<void()> onYield_;
+};
+
+TEST_F(GameTreeBuilderTest, AllGamesStopsWhenTreeIsRebuiltDuringYield) {
+    for (int i = 0; i < 300; ++i) Entry("g" + std::to_string(i) + ".zip", "Game", "Maze");
+    Record("g1.zip", "Game");
+    NoStatusDisplay status;
+    RebuildingYield yield([&] { Build(); });
+    AddAllEmulatedGames(tree, library, records, SnapshotIndex(), status, yield);
+    EXPECT_EQ(tree.Find("MAME.ROMS"), NoNode);
+    EXPECT_EQ(tree.ChildCount(tree.Find("alpha_")), 1);
+    EXPECT_EQ(tree.ChildCount(tree.Find("Maze_")), 1);
+    EXPECT_EQ(tree.Count(), 4);
+}
+
+TEST_F(GameTreeBuilderTest, AllGamesSurvivesLibraryEmptiedDuringYield) {
+    for (int i = 0; i < 300; ++i) Entry("g" + std::to_string(i) + ".zip", "Game", "Maze");
+    NoStatusDisplay status;
+    RebuildingYield yield([&] { library.Clear(); });
+    EXPECT_TRUE(AddAllEmulatedGames(tree, library, records, SnapshotIndex(), status, yield));
+    EXPECT_EQ(tree.ChildCount(tree.Find("MAME.ROMS")), 100);
+}
+
+}  // namespace
+}  // namespace qv
