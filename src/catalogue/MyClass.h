@@ -37,6 +37,9 @@ public:
     std::string Extra;
     std::string Resolution;
     std::int32_t PlaySeconds = 0;
+    // The games.inc line a record was read from. The record is saved as that line while its
+    // fields still match it, so columns and texts the reader does not keep are not lost.
+    std::string StoredLine;
 
     MyClass() = default;
     MyClass(const MyClass&) = delete;
