@@ -27,4 +27,50 @@ std::filesystem::path WriteRomLibrary(const std::filesystem::path& folder, int g
     return path;
 }
 
+void FillRomLibrary(MyClass& library, int games) {
+    static const char* kGenres[] = {"Maze", "Shooter", "Platform", "Sports", "Racing",
+                                    "Puzzle", "Fighter", "Climbing", "Driving", "Casino",
+                                    "Quiz", "Ball & Paddle"};
+    library.Reserve(static_cast<std::size_t>(games));
+    for (int i = 0; i < games; ++i) {
+        const std::string romFile = "game" + std::to_string(i) + ".zip";
+        MyClass* entry = library.Add(romFile);
+        if (entry == nullptr) continue;
+        entry->RomFile = romFile;
+        entry->Title = "Generated Game " + std::to_string(i);
+        entry->Year = std::to_string(1978 + i % 30);
+        entry->Company = "Maker " + std::to_string(i % 400);
+        entry->EmuWorking = i % 7 != 0;
+        entry->Category = i % 50 == 0 ? "" : kGenres[i % 12];
+    }
+}
+
+void FillGameRecords(MyClass& records, int owned, int libraryGames) {
+    records.Reserve(static_cast<std::size_t>(owned));
+    const int step = owned > 0 && libraryGames > owned ? libraryGames / owned : 1;
+    for (int n = 0; n < owned; ++n) {
+        const int game = n * step;
+        const std::string romFile = "game" + std::to_string(game) + ".zip";
+        MyClass* record = records.Add(romFile);
+        if (record == nullptr) continue;
+        record->RomFile = n % 97 == 0 ? "^" + romFile : romFile;
+        record->Title = n % 41 == 0 ? romFile : "Generated Game " + std::to_string(game);
+        record->Working = n % 9 != 0;
+        record->Hidden = n % 23 == 0;
+        record->Present = n % 13 != 0;
+        record->LastPlayed = "Never";
+    }
+}
+
+std::filesystem::path WriteSnapshotFolder(const std::filesystem::path& folder, int games,
+                                          int every) {
+    const auto snap = folder / ("snap_" + std::to_string(games) + "_" + std::to_string(every));
+    if (std::filesystem::exists(snap / "done")) return snap;
+    std::filesystem::create_directories(snap);
+    for (int i = 0; i < games; i += every)
+        std::ofstream(snap / ("game" + std::to_string(i) + ".png"), std::ios::binary);
+    std::ofstream(snap / "done", std::ios::binary);
+    return snap;
+}
+
 }  // namespace qv::bench
