@@ -49,7 +49,9 @@ struct DetailsState {
     // Set once an artwork archive of a selected game was found; allows artwork to be switched on.
     bool artworkMark = false;
 
-    std::string resolution = "Auto";
+    std::string resolution = "Auto";  // Label21
+    PanelText executable;             // Label25: the emulator build, green when it exists
+    std::string version;              // Label32: "Using mame Version: 0.251"
     int rating = 0;  // the one rating image shown, IR0..IR5
     PlayImage play = PlayImage::Normal;
     bool downloadShown = false;  // "ROM" download label and its button image

@@ -69,6 +69,14 @@ const SwitchView& SwitchOf(const DetailsState& state, PanelSwitch which) {
     return SwitchOf(const_cast<DetailsState&>(state), which);
 }
 
+void HoverPlay(DetailsState& state) {
+    if (state.play == PlayImage::Normal && state.working.on) state.play = PlayImage::Active;
+}
+
+void RestorePlay(DetailsState& state) {
+    if (state.play == PlayImage::Active) state.play = PlayImage::Normal;
+}
+
 PanelSwitches::PanelSwitches(DetailsState& state, MyClass& records, Options& options)
     : state_(state), records_(records), options_(options) {}
 

@@ -38,6 +38,11 @@ private:
     Options& options_;
 };
 
+// The play button: the mouse over IPlayN shows IPlayY when the game is working; the mouse over
+// the window background, or a click on IPlayY, puts IPlayN back. IPlayX stays as it is.
+void HoverPlay(DetailsState& state);
+void RestorePlay(DetailsState& state);
+
 // The shown state and label of a switch.
 SwitchView& SwitchOf(DetailsState& state, PanelSwitch which);
 const SwitchView& SwitchOf(const DetailsState& state, PanelSwitch which);
