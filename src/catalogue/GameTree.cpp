@@ -2,8 +2,6 @@
 
 #include <algorithm>
 
-#include "catalogue/MyClass.h"
-
 namespace qv {
 
 namespace {
@@ -11,6 +9,62 @@ inline unsigned char Fold(char c) {
     return static_cast<unsigned char>(c >= 'A' && c <= 'Z' ? c - 'A' + 'a' : c);
 }
 }  // namespace
+
+std::uint32_t GameTree::KeyHash(std::string_view key) {
+    std::uint64_t h = 14695981039346656037ull;  // FNV-1a over the folded bytes
+    for (const char c : key) {
+        h ^= Fold(c);
+        h *= 1099511628211ull;
+    }
+    h ^= h >> 33;  // spread the bits so that neighbouring slots stay independent
+    h *= 0xff51afd7ed558ccdull;
+    h ^= h >> 33;
+    return static_cast<std::uint32_t>(h);
+}
+
+bool GameTree::SameKey(std::string_view a, std::string_view b) {
+    if (a.size() != b.size()) return false;
+    for (std::size_t i = 0; i < a.size(); ++i)
+        if (Fold(a[i]) != Fold(b[i])) return false;
+    return true;
+}
+
+NodeId GameTree::FindSlot(std::string_view key, std::uint32_t hash, std::size_t& slot) const {
+    if (keySlots_.empty()) return NoNode;
+    const std::size_t mask = keySlots_.size() - 1;
+    for (slot = hash & mask;; slot = (slot + 1) & mask) {
+        const KeySlot& entry = keySlots_[slot];
+        if (entry.id == NoNode) return NoNode;
+        if (entry.hash == hash && SameKey(nodes_[static_cast<std::size_t>(entry.id)].Key, key))
+            return entry.id;
+    }
+}
+
+void GameTree::IndexKey(NodeId id, std::uint32_t hash) {
+    if ((keyCount_ + 1) * 2 > keySlots_.size()) RebuildKeyIndex(keyCount_ + 1);
+    const std::size_t mask = keySlots_.size() - 1;
+    std::size_t slot = hash & mask;
+    while (keySlots_[slot].id != NoNode) slot = (slot + 1) & mask;
+    keySlots_[slot] = KeySlot{hash, id};
+    ++keyCount_;
+}
+
+void GameTree::RebuildKeyIndex(std::size_t capacityFor) {
+    std::size_t size = 16;
+    while (size < capacityFor * 2) size *= 2;
+    std::vector<KeySlot> old = std::move(keySlots_);
+    keySlots_.assign(size, KeySlot{});
+    keyCount_ = 0;
+    const std::size_t mask = size - 1;
+    auto place = [&](const KeySlot& entry) {
+        std::size_t slot = entry.hash & mask;
+        while (keySlots_[slot].id != NoNode) slot = (slot + 1) & mask;
+        keySlots_[slot] = entry;
+        ++keyCount_;
+    };
+    for (const KeySlot& entry : old)
+        if (entry.id != NoNode) place(entry);
+}
 
 bool GameTree::TextLess(std::string_view a, std::string_view b) {
     const std::size_t n = std::min(a.size(), b.size());
@@ -26,7 +80,15 @@ void GameTree::Clear() {
     children_.clear();
     topLevel_ = {};
     rows_.clear();
-    byKey_.clear();
+    keySlots_.clear();
+    keyCount_ = 0;
+}
+
+void GameTree::Reserve(std::size_t nodes) {
+    nodes_.reserve(nodes);
+    children_.reserve(nodes);
+    rows_.reserve(nodes);
+    if (nodes * 2 > keySlots_.size()) RebuildKeyIndex(nodes);
 }
 
 GameTree::ChildList& GameTree::ListOf(NodeId parent) {
@@ -43,11 +105,14 @@ NodeId GameTree::Add(NodeId parent, std::string key, std::string text, std::stri
                      std::string expandedImage) {
     if (parent != NoNode && (parent < 0 || parent >= Count())) return NoNode;
     const auto id = static_cast<NodeId>(nodes_.size());
-    if (!byKey_.try_emplace(MyClass::FoldKey(key), id).second) return NoNode;
+    const std::uint32_t hash = KeyHash(key);
+    std::size_t slot = 0;
+    if (FindSlot(key, hash, slot) != NoNode) return NoNode;
     nodes_.push_back(TreeNode{std::move(key), std::move(text), std::move(image),
                               std::move(expandedImage), colours::Black, {}, parent});
     children_.emplace_back();
     rows_.push_back(0);
+    IndexKey(id, hash);
     ChildList& siblings = ListOf(parent);
     siblings.ids.push_back(id);
     siblings.sorted = false;
@@ -91,14 +156,16 @@ void GameTree::Remove(NodeId node) {
     topLevel_.sorted = false;
     for (auto& list : children_) list.sorted = false;
     rows_.assign(nodes_.size(), 0);
-    byKey_.clear();
+    keySlots_.clear();
+    keyCount_ = 0;
+    RebuildKeyIndex(nodes_.size());
     for (std::size_t i = 0; i < nodes_.size(); ++i)
-        byKey_.emplace(MyClass::FoldKey(nodes_[i].Key), static_cast<NodeId>(i));
+        IndexKey(static_cast<NodeId>(i), KeyHash(nodes_[i].Key));
 }
 
 NodeId GameTree::Find(std::string_view key) const {
-    const auto found = byKey_.find(MyClass::FoldKey(key));
-    return found == byKey_.end() ? NoNode : found->second;
+    std::size_t slot = 0;
+    return FindSlot(key, KeyHash(key), slot);
 }
 
 bool GameTree::NodeExists(std::string_view key) const {

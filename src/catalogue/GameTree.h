@@ -2,7 +2,6 @@
 #include <cstdint>
 #include <string>
 #include <string_view>
-#include <unordered_map>
 #include <vector>
 
 namespace qv {
@@ -41,6 +40,8 @@ struct TreeNode {
 class GameTree {
 public:
     void Clear();
+    // Room for this many nodes in all, so that a large fill does not regrow the tables.
+    void Reserve(std::size_t nodes);
 
     // Adds a node under parent (NoNode: top level). Returns NoNode when the key is taken.
     NodeId Add(NodeId parent, std::string key, std::string text, std::string image = {},
@@ -86,7 +87,20 @@ private:
     std::vector<ChildList> children_;  // per node
     ChildList topLevel_;
     mutable std::vector<std::int32_t> rows_;  // per node, valid once its parent's list is sorted
-    std::unordered_map<std::string, NodeId> byKey_;  // folded key -> id
+    // Key lookup: open addressing over node ids, keyed by the case-folded hash, comparing the
+    // nodes' own keys. No folded copies and no per-key allocation, which matters with 45,000+
+    // nodes added at a time.
+    struct KeySlot {
+        std::uint32_t hash = 0;
+        NodeId id = NoNode;
+    };
+    static std::uint32_t KeyHash(std::string_view key);
+    static bool SameKey(std::string_view a, std::string_view b);
+    NodeId FindSlot(std::string_view key, std::uint32_t hash, std::size_t& slot) const;
+    void IndexKey(NodeId id, std::uint32_t hash);
+    void RebuildKeyIndex(std::size_t capacityFor);
+    std::vector<KeySlot> keySlots_;  // size is zero or a power of two, at most half full
+    std::size_t keyCount_ = 0;
 };
 
 }  // namespace qv

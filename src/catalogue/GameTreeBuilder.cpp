@@ -87,6 +87,8 @@ void AddGameNode(GameTree& tree, const SnapshotIndex& snapshots, const std::stri
 void BuildGameTree(GameTree& tree, MyClass& records, const MyClass& library,
                    const Options& options, const SnapshotIndex& snapshots) {
     tree.Clear();
+    // Each shown record gives at most two nodes (alphabetical and category).
+    tree.Reserve(2 * static_cast<std::size_t>(records.Count()) + 1);
     tree.Add(NoNode, std::string(kAlphaGroup) + "_", kAlphaText, kClosedFolder, kOpenFolder);
 
     for (MyClass& record : records) {
@@ -117,6 +119,7 @@ bool AddAllEmulatedGames(GameTree& tree, const MyClass& library, const MyClass& 
     NodeId root = tree.Add(NoNode, kAllGamesKey, kAllGamesText, kClosedFolder, kOpenFolder);
     if (root == NoNode) return false;
 
+    tree.Reserve(static_cast<std::size_t>(tree.Count()) + static_cast<std::size_t>(library.Count()));
     const std::string prefix = std::string(kAllGamesKey) + "_";
     // Walk by position and re-check the count: window events run during the yields below and
     // may reload the library or rebuild the tree.
