@@ -2,7 +2,16 @@
 
 #include <QFile>
 
+// The pictures are compiled into the window library, a static library: its resources must be
+// registered by name before the first lookup.
+static void RegisterQuorvaneResources() { Q_INIT_RESOURCE(quorvane); }
+
 namespace qv {
+
+IconSet::IconSet() {
+    static const bool registered = (RegisterQuorvaneResources(), true);
+    (void)registered;
+}
 
 QString IconSet::ResourcePath(const std::string& key) {
     return QStringLiteral(":/icons/") + QString::fromStdString(key) + QStringLiteral(".png");

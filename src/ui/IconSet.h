@@ -10,6 +10,7 @@ namespace qv {
 // "logo"...), loaded once from the resources. An unknown or empty key gives a null icon.
 class IconSet {
 public:
+    IconSet();
     const QIcon& Icon(const std::string& key);
     static QString ResourcePath(const std::string& key);
 

@@ -7,6 +7,7 @@
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QMenuBar>
+#include <QScreen>
 #include <QTreeView>
 #include <QVBoxLayout>
 
@@ -118,6 +119,8 @@ void PlayForm::Load() {
     speechReady_ = true;
     if (hooks_.checkVoice) hooks_.checkVoice();
     ShowCount();
+    // Without a window manager a maximise request is not honoured; fill the screen anyway.
+    if (const QScreen* screen = this->screen()) setGeometry(screen->availableGeometry());
     showMaximized();
     Speak(options.Intro);
     CloseWait();
@@ -183,6 +186,7 @@ void PlayForm::Refresh() {
 
 void PlayForm::FullScreen() {
     ShowMenuBar(false);
+    if (const QScreen* screen = this->screen()) setGeometry(screen->availableGeometry());
     showMaximized();
 }
 
