@@ -21,7 +21,8 @@ QString LongVersion() {
 QString CreditLine() { return QStringLiteral("Written by the Quorvane developers"); }
 
 QLabel* MakeLogo(QWidget* parent) {
-    auto* logo = new QLabel(QStringLiteral("Quorvane"), parent);
+    auto* logo = new QLabel(
+        QStringLiteral("<img src=\":/icons/logo.png\" align=\"middle\"> Quorvane"), parent);
     logo->setObjectName(QStringLiteral("imgLogo"));
     logo->setAlignment(Qt::AlignCenter);
     logo->setStyleSheet(QStringLiteral(
