@@ -73,4 +73,38 @@ std::filesystem::path WriteSnapshotFolder(const std::filesystem::path& folder, i
     return snap;
 }
 
+std::filesystem::path WriteGamesFile(const std::filesystem::path& folder, int records) {
+    static const char* kRatings[] = {"", "*", "**", "***", "****", "*****"};
+    const auto path = folder / ("games_" + std::to_string(records) + ".inc");
+    if (std::filesystem::exists(path)) return path;
+    std::ofstream out(path, std::ios::binary);
+    for (int i = 0; i < records; ++i) {
+        const std::string romFile = "game" + std::to_string(i) + ".zip";
+        out << (i % 97 == 0 ? "^" : "") << romFile << "\t\"Generated Game " << i << "\"\t"
+            << (i % 5 == 0 ? "Beat level<crlf><tab>" + std::to_string(i) : "") << "\t"
+            << (i % 9 ? "True" : "False") << "\t" << (i % 17 ? "False" : "True") << "\t"
+            << 1978 + i % 30 << "\tMaker " << i % 400 << "\t" << kRatings[i % 6] << "\t"
+            << (i % 3 ? "Favourites" : "") << "\t" << (i % 23 ? "False" : "True") << "\t"
+            << i % 300 << "\t" << (i % 4 ? "3/17/2004 3:30:00 PM" : "Never") << "\t"
+            << (i % 11 ? "" : "640x480") << "\t" << i * 37 << "\r\n";
+    }
+    return path;
+}
+
+std::filesystem::path WriteRomFolder(const std::filesystem::path& folder, int archives,
+                                     int first) {
+    const auto roms =
+        folder / ("roms_" + std::to_string(archives) + "_" + std::to_string(first));
+    if (std::filesystem::exists(roms / "readme.txt")) return roms;
+    std::filesystem::create_directories(roms);
+    const std::string bytes(64, 'z');
+    for (int i = first; i < first + archives; ++i) {
+        std::ofstream archive(roms / ("game" + std::to_string(i) + ".zip"), std::ios::binary);
+        archive.write(bytes.data(), static_cast<std::streamsize>(bytes.size()) - i % 32);
+    }
+    // Written last: its presence says the folder is complete.
+    std::ofstream(roms / "readme.txt", std::ios::binary) << "Generated ROM folder\r\n";
+    return roms;
+}
+
 }  // namespace qv::bench

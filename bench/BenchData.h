@@ -21,4 +21,12 @@ void FillGameRecords(MyClass& records, int owned, int libraryGames);
 std::filesystem::path WriteSnapshotFolder(const std::filesystem::path& folder, int games,
                                           int every);
 
+// A games.inc of `records` records game0.zip.. (notes, ratings, plays, some removed "^"
+// games); returns its path.
+std::filesystem::path WriteGamesFile(const std::filesystem::path& folder, int records);
+// A ROM folder of `archives` small archives game<first>.zip.. plus a readme.txt; returns its
+// path.
+std::filesystem::path WriteRomFolder(const std::filesystem::path& folder, int archives,
+                                     int first);
+
 }  // namespace qv::bench

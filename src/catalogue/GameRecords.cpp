@@ -38,17 +38,20 @@ bool ReadInteger(std::string_view text, T& field) {
 void SetRecordFields(MyClass& record, std::string_view line) {
     const TabColumns<kRecordColumns> columns(line);
     record.RomFile.assign(columns[0]);
-    record.Title = columns[1].empty() ? std::string(columns[0]) : WithoutQuotes(columns[1]);
+    if (columns[1].empty())
+        record.Title.assign(columns[0]);
+    else
+        AssignWithoutQuotes(record.Title, columns[1]);
     record.Notes.assign(columns[2]);
     record.Working = RecordFlag(columns[3]);
     record.Mouse = RecordFlag(columns[4]);
     record.Year.assign(columns[5]);
-    record.Company = WithoutQuotes(columns[6]);
+    AssignWithoutQuotes(record.Company, columns[6]);
     record.Rating.assign(columns[7]);
     record.Categories.assign(columns[8]);
     record.Hidden = RecordFlag(columns[9]);
     ReadInteger(columns[10], record.Plays);
-    record.LastPlayed = columns[11].empty() ? std::string("Never") : std::string(columns[11]);
+    record.LastPlayed.assign(columns[11].empty() ? std::string_view("Never") : columns[11]);
     record.Resolution.assign(TrimSpaces(columns[12]));
     ReadInteger(columns[13], record.PlaySeconds);
     record.Present = false;
