@@ -34,6 +34,13 @@ void EnsureLogsFolder(const GameLauncherServices& s) {
                                                                  ": " + error.message()});
 }
 
+// MameExec names a file inside MamePath; a name with a folder in it would start a program
+// from somewhere else.
+bool IsBareName(const std::string& name) {
+    return !name.empty() && name != "." && name != ".." &&
+           name.find_first_of("/\\") == std::string::npos;
+}
+
 }  // namespace
 
 RunResult RunGame(const RunRequest& request, const GameLauncherServices& s) {
@@ -78,7 +85,7 @@ RunResult RunGame(const RunRequest& request, const GameLauncherServices& s) {
         if (std::filesystem::is_directory(s.options.MamePath, error))
             launch.workingDirectory = s.options.MamePath;
 
-        const ProcessId id = s.launcher.Start(launch);
+        const ProcessId id = IsBareName(s.options.MameExec) ? s.launcher.Start(launch) : 0;
         // Logging yields to the event loop: look the record up again in case it went meanwhile.
         game = s.records.Item(request.selectedGameKey);
         if (id == 0) {

@@ -171,6 +171,16 @@ TEST_F(GameLauncherTest, EmulatorThatCannotStartIsReported) {
     EXPECT_FALSE(watch.Watching());
 }
 
+TEST_F(GameLauncherTest, EmulatorNameWithAFolderIsNotStarted) {
+    options.MameExec = "../" + fs::path(TEST_EMULATOR_PATH).parent_path().filename().string() +
+                       "/" + fs::path(TEST_EMULATOR_PATH).filename().string();
+    ASSERT_TRUE(fs::exists(fs::path(options.MamePath) / options.MameExec));
+    AddGame("pong.zip", "Pong");
+    request.selectedGameKey = "pong.zip";
+    EXPECT_EQ(RunGame(request, Services()).outcome, RunOutcome::StartFailed);
+    EXPECT_FALSE(watch.Watching());
+}
+
 TEST_F(GameLauncherTest, KeyWithoutRecordIsAFailureWithTheSafeModeAdvice) {
     request.selectedGameKey = "ghost.zip";
     EXPECT_EQ(RunGame(request, Services()).outcome, RunOutcome::Failed);
