@@ -16,7 +16,9 @@
 #include "platform/qt/QtEventYield.h"
 #include "platform/qt/QtPrompt.h"
 #include "platform/qt/QtRegional.h"
+#include "platform/qt/QtSpeechEngine.h"
 #include "ui/AppFolder.h"
+#include "ui/GameRoadController.h"
 #include "ui/PlayForm.h"
 #include "ui/Program.h"
 #include "ui/WaitWindow.h"
@@ -49,8 +51,12 @@ int RunQuorvane(int argc, char** argv) {
     Options& options = program.options;
     SetDefaults(options, program.appFolder, program.host, home, &hostInfo);
 
+    // The speech engine and the game launcher outlive the window that uses them.
+    QtSpeechEngine speech;
+    PosixProcessLauncher gameLauncher;
     WaitWindow wait(program.yield.get());
     PlayForm form(program, &wait);
+    new GameRoadController(form, program, speech, gameLauncher);  // owned by the window
     QObject::connect(&form, &PlayForm::quitConfirmed, &app, [] { QCoreApplication::exit(0); });
 
     const auto configFile = program.appFolder / "config.inc";
