@@ -1,10 +1,11 @@
 #pragma once
 #include <QObject>
 #include <QPersistentModelIndex>
+#include <QLineEdit>
 #include <QPointer>
 #include <functional>
 
-class QLineEdit;
+
 class QTreeView;
 
 namespace qv {
