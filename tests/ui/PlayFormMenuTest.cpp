@@ -1,0 +1,152 @@
+#include <QListWidget>
+#include <QMenu>
+#include <QMenuBar>
+#include <QTest>
+#include <QTreeView>
+
+#include "PlayFormFixture.h"
+#include "ui/ClickLabel.h"
+
+namespace qv::test {
+namespace {
+
+using PlayFormMenuTest = PlayFormFixture;
+
+// Captions of a menu in order; "-" for a separator, "(off)" after a command that cannot be
+// chosen.
+QStringList Captions(const QMenu* menu) {
+    QStringList captions;
+    for (const QAction* action : menu->actions()) {
+        if (action->isSeparator()) captions << "-";
+        else captions << action->text() + (action->isEnabled() ? "" : " (off)");
+    }
+    return captions;
+}
+
+const QMenu* MenuNamed(const PlayForm& window, const QString& title) {
+    for (const QAction* action : window.menuBar()->actions())
+        if (action->text() == title) return action->menu();
+    return nullptr;
+}
+
+TEST_F(PlayFormMenuTest, MenusHaveTheirCommandsInOrderAndUnbuiltOnesAreOff) {
+    PlayForm& window = Open();
+    QStringList titles;
+    for (const QAction* action : window.menuBar()->actions()) titles << action->text();
+    EXPECT_EQ(titles, (QStringList{"&File", "&Edit", "&View", "&Help"}));
+
+    EXPECT_EQ(Captions(MenuNamed(window, "&File")),
+              (QStringList{"&Save ROM Information", "Use Voice (off)", "Options ... (off)",
+                           "Internet Update ... (off)", "Download Screenshots (off)",
+                           "Initialize MAME (off)", "Safe Mode (off)", "-", "Exit"}));
+    EXPECT_EQ(Captions(MenuNamed(window, "&Edit")),
+              (QStringList{"Refresh", "Rename (off)", "Delete (off)", "-",
+                           "Edit Game Notes (off)", "View Game History (off)",
+                           "View Game Log File (off)", "View Game Screenshot (off)", "-",
+                           "Insert MAME Information (off)",
+                           "Update MAME Info for All ROMs (off)", "-",
+                           "Download ROMs ... (off)"}));
+    EXPECT_EQ(Captions(MenuNamed(window, "&View")),
+              (QStringList{"View My Hidden ROMs", "View My Working ROMs Only", "-",
+                           "Add All Emulated Games", "-", "Full Screen", "Normal",
+                           "Minimize"}));
+    const QStringList help = Captions(MenuNamed(window, "&Help"));
+    ASSERT_EQ(help.size(), 4);
+    EXPECT_TRUE(help[0].startsWith("Quorvane Help"));
+    EXPECT_TRUE(help[1].startsWith("MAME Tips"));
+    EXPECT_EQ(help[2], "-");
+    EXPECT_TRUE(help[3].startsWith("About Quorvane"));
+
+    for (const char* name : {"mSave", "mVoice", "mConfig", "mUpdate", "mDownloadSnaps",
+                             "mMAMEConf", "mSafeMode", "mExit", "mRefresh", "mRename",
+                             "mDelete", "mNotes", "mHistory", "mLog", "mScreenshot",
+                             "mInsertInfo", "mUpdateAll", "mDownloadRoms", "mViewHidden",
+                             "mViewWorking", "mViewAll", "mFullScreen", "mNormal",
+                             "mMinimize", "mHelp", "mMAMEHelp", "mAbout"})
+        Command(name);
+}
+
+TEST_F(PlayFormMenuTest, WithoutEditingTheEditingCommandsAreOffAndNotesAreOnlyViewed) {
+    program.options.Edit = false;
+    Open();
+    EXPECT_FALSE(Command("mSave")->isEnabled());
+    EXPECT_FALSE(Command("mDelete")->isEnabled());
+    EXPECT_EQ(Command("mNotes")->text(), "View Game Notes");
+    EXPECT_TRUE(Command("mRefresh")->isEnabled());
+}
+
+TEST_F(PlayFormMenuTest, UseVoiceIsUncheckedWhenSpeechIsOff) {
+    program.options.Speak = false;
+    Open();
+    EXPECT_FALSE(Command("mVoice")->isChecked());
+}
+
+TEST_F(PlayFormMenuTest, LogoClicksShowAndHideTheMenuBar) {
+    PlayForm& window = Open();
+    EXPECT_FALSE(window.MenuBarShown());
+    EXPECT_TRUE(window.menuBar()->isHidden());
+    auto* logo = window.findChild<ClickLabel*>("Image3");
+    ASSERT_NE(logo, nullptr);
+    QTest::mouseClick(logo, Qt::LeftButton);
+    EXPECT_TRUE(window.MenuBarShown());
+    EXPECT_FALSE(window.menuBar()->isHidden());
+    QTest::mouseClick(logo, Qt::LeftButton);
+    EXPECT_FALSE(window.MenuBarShown());
+    EXPECT_TRUE(window.menuBar()->isHidden());
+}
+
+TEST_F(PlayFormMenuTest, LogoDoubleClickAndCountLabelClickSpeak) {
+    PlayForm& window = Open();
+    std::vector<std::string> spoken;
+    window.Hooks().speak = [&](const std::string& text) { spoken.push_back(text); };
+    QTest::mouseDClick(window.findChild<ClickLabel*>("Image3"), Qt::LeftButton);
+    QTest::mouseClick(window.findChild<ClickLabel*>("Label15"), Qt::LeftButton);
+    ASSERT_EQ(spoken.size(), 2u);
+    EXPECT_EQ(spoken[0], "Quorvane! Version 2.25");
+    EXPECT_EQ(spoken[1], "8 ROMS (13 KB)");
+}
+
+TEST_F(PlayFormMenuTest, RightButtonOnTheCountLabelSwapsTreeAndFileList) {
+    PlayForm& window = Open();
+    auto* tree = window.findChild<QTreeView*>("TreeView1");
+    auto* files = window.findChild<QListWidget*>("File1");
+    ASSERT_NE(files, nullptr);
+    EXPECT_FALSE(tree->isHidden());
+    EXPECT_TRUE(files->isHidden());
+
+    QTest::mousePress(window.findChild<ClickLabel*>("Label15"), Qt::RightButton);
+    EXPECT_TRUE(tree->isHidden());
+    EXPECT_FALSE(files->isHidden());
+    QStringList names;
+    for (int row = 0; row < files->count(); ++row) names << files->item(row)->text();
+    EXPECT_EQ(names, (QStringList{"digdug.zip", "dkong.zip", "galaga.zip", "joust.zip",
+                                  "mystery.zip", "pacman.zip", "qbert.zip", "readme.txt"}));
+
+    QTest::mousePress(window.findChild<ClickLabel*>("Label15"), Qt::RightButton);
+    EXPECT_FALSE(tree->isHidden());
+    EXPECT_TRUE(files->isHidden());
+}
+
+TEST_F(PlayFormMenuTest, FullScreenHidesTheMenusAndMinimizeMinimizes) {
+    PlayForm& window = Open();
+    window.ShowMenuBar(true);
+    Command("mFullScreen")->trigger();
+    EXPECT_FALSE(window.MenuBarShown());
+    Command("mMinimize")->trigger();
+    EXPECT_TRUE(window.windowState() & Qt::WindowMinimized);
+}
+
+TEST_F(PlayFormMenuTest, DoubleClickOnAGameAsksToRunItButNotOnAFolder) {
+    PlayForm& window = Open();
+    std::vector<NodeId> started;
+    window.Hooks().runGame = [&](NodeId node) { started.push_back(node); };
+    auto* view = window.findChild<QTreeView*>("TreeView1");
+    emit view->doubleClicked(NodeIndex("Maze_"));
+    EXPECT_TRUE(started.empty());
+    emit view->doubleClicked(NodeIndex("alpha_pacman.zip"));
+    ASSERT_EQ(started.size(), 1u);
+    EXPECT_EQ(window.Tree().Node(started[0]).Tag, "pacman.zip");
+}
+
+}  // namespace
+}  // namespace qv::test

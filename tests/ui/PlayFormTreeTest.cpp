@@ -1,0 +1,139 @@
+#include <QLabel>
+#include <QTreeView>
+
+#include "PlayFormFixture.h"
+
+namespace qv::test {
+namespace {
+
+using PlayFormTreeTest = PlayFormFixture;
+
+const QColor kBlack(0, 0, 0), kRed(255, 0, 0), kGrey(128, 128, 128), kLightBlue(128, 128, 255),
+    kBlue(0, 0, 255);
+
+TEST_F(PlayFormTreeTest, OpensWithTheUsersGamesByTitleAndByCategory) {
+    PlayForm& window = Open();
+    EXPECT_EQ(window.objectName(), "PlayForm");
+    // pacman, digdug, galaga, dkong, missile, the unidentified mystery.zip; joust is hidden and
+    // ^qbert removed.
+    EXPECT_EQ(TopLevelTexts(),
+              (QStringList{" Alphabetical (6)", "Maze (2)", "Platform (1)", "Shooter (2)"}));
+    const QModelIndex alpha = NodeIndex("alpha_");
+    QStringList titles;
+    for (int row = 0; row < Model().rowCount(alpha); ++row)
+        titles << Model().index(row, 0, alpha).data().toString();
+    EXPECT_EQ(titles, (QStringList{"Dig Dug", "Donkey Kong", "Galaga", "Missile Command",
+                                   "mystery.zip", "Pac-Man"}));
+    EXPECT_FALSE(NodeIndex("alpha_joust.zip").isValid());
+    EXPECT_FALSE(NodeIndex("alpha_^qbert.zip").isValid());
+    EXPECT_FALSE(NodeIndex("alpha_qbert.zip").isValid());
+}
+
+TEST_F(PlayFormTreeTest, ColoursAndPicturesTellWorkingPresentAndScreenshot) {
+    Open();
+    EXPECT_EQ(ColourOf("alpha_pacman.zip"), kBlack);       // working, present, screenshot
+    EXPECT_EQ(PictureOf("alpha_pacman.zip"), "good");
+    EXPECT_EQ(ColourOf("alpha_galaga.zip"), kLightBlue);   // no screenshot
+    EXPECT_EQ(PictureOf("alpha_galaga.zip"), "good");
+    EXPECT_EQ(ColourOf("alpha_dkong.zip"), kRed);          // not marked working
+    EXPECT_EQ(PictureOf("alpha_dkong.zip"), "bad");
+    EXPECT_EQ(ColourOf("alpha_missile.zip"), kGrey);       // archive missing
+    EXPECT_EQ(PictureOf("alpha_missile.zip"), "bad");
+    EXPECT_EQ(ColourOf("Shooter_missile.zip"), kGrey);
+    EXPECT_FALSE(program.gameRecords.Item("missile.zip")->Working);
+    EXPECT_EQ(PictureOf("alpha_"), "fclosed");
+    EXPECT_FALSE(NodeIndex("Maze_pacman.zip").data(Qt::DecorationRole).value<QIcon>().isNull());
+}
+
+TEST_F(PlayFormTreeTest, OpeningAFolderInTheViewShowsTheOpenFolder) {
+    PlayForm& window = Open();
+    QTreeView* view = window.findChild<QTreeView*>("TreeView1");
+    ASSERT_NE(view, nullptr);
+    view->expand(NodeIndex("Maze_"));
+    EXPECT_EQ(PictureOf("Maze_"), "fopen");
+    view->collapse(NodeIndex("Maze_"));
+    EXPECT_EQ(PictureOf("Maze_"), "fclosed");
+}
+
+TEST_F(PlayFormTreeTest, HiddenGamesFilterFollowsItsCheckMark) {
+    program.options.ShowHidden = true;
+    Open();
+    QAction* hidden = Command("mViewHidden");
+    EXPECT_TRUE(hidden->isChecked());
+    EXPECT_TRUE(NodeIndex("alpha_joust.zip").isValid());
+
+    hidden->trigger();
+    EXPECT_FALSE(hidden->isChecked());
+    EXPECT_FALSE(program.options.ShowHidden);
+    EXPECT_FALSE(NodeIndex("alpha_joust.zip").isValid());
+    EXPECT_EQ(TextOf("alpha_"), " Alphabetical (6)");
+}
+
+TEST_F(PlayFormTreeTest, WorkingOnlyFilterKeepsUnidentifiedArchives) {
+    Open();
+    QAction* working = Command("mViewWorking");
+    EXPECT_FALSE(working->isChecked());
+    working->trigger();
+    EXPECT_TRUE(working->isChecked());
+    EXPECT_TRUE(program.options.ShowWorking);
+    EXPECT_FALSE(NodeIndex("alpha_dkong.zip").isValid());
+    EXPECT_FALSE(NodeIndex("alpha_missile.zip").isValid());  // marked not working: missing
+    EXPECT_TRUE(NodeIndex("alpha_mystery.zip").isValid());
+    EXPECT_TRUE(NodeIndex("alpha_pacman.zip").isValid());
+}
+
+TEST_F(PlayFormTreeTest, AddAllEmulatedGamesAddsTheLibraryOnce) {
+    Open();
+    QAction* addAll = Command("mViewAll");
+    addAll->trigger();
+    const QModelIndex all = NodeIndex("MAME.ROMS");
+    ASSERT_TRUE(all.isValid());
+    EXPECT_EQ(all.data().toString(), "All MAME ROMs");
+    EXPECT_EQ(Model().rowCount(all), 8);
+    EXPECT_EQ(ColourOf("MAME.ROMS_asteroid.zip"), kBlue);  // screenshot, not owned
+    EXPECT_EQ(PictureOf("MAME.ROMS_asteroid.zip"), "bad");
+    EXPECT_EQ(ColourOf("MAME.ROMS_pacman.zip"), kBlack);
+    EXPECT_EQ(PictureOf("MAME.ROMS_pacman.zip"), "good");
+
+    const int before = form->Tree().Count();
+    addAll->trigger();
+    EXPECT_EQ(form->Tree().Count(), before);
+    EXPECT_EQ(Model().rowCount(), 5);
+}
+
+TEST_F(PlayFormTreeTest, AddAllKeepsOpenFoldersOpen) {
+    PlayForm& window = Open();
+    QTreeView* view = window.findChild<QTreeView*>("TreeView1");
+    view->expand(NodeIndex("alpha_"));
+    Command("mViewAll")->trigger();
+    EXPECT_TRUE(view->isExpanded(NodeIndex("alpha_")));
+    EXPECT_EQ(PictureOf("alpha_"), "fopen");
+    EXPECT_FALSE(view->isExpanded(NodeIndex("MAME.ROMS")));
+}
+
+TEST_F(PlayFormTreeTest, RefreshReadsRecordsAndFolderAgain) {
+    PlayForm& window = Open();
+    Command("mViewAll")->trigger();
+    home.Write("roms/galaxian.zip", std::string(1024, 'g'));
+    home.Write("games.inc", GamesInc() + "frogger.zip\tFrogger\r\n");
+
+    Command("mRefresh")->trigger();
+    EXPECT_FALSE(NodeIndex("MAME.ROMS").isValid());  // a rebuild drops the all-games folder
+    EXPECT_TRUE(NodeIndex("alpha_galaxian.zip").isValid());
+    EXPECT_EQ(ColourOf("alpha_frogger.zip"), kGrey);
+    EXPECT_EQ(TextOf("alpha_"), " Alphabetical (8)");
+    EXPECT_EQ(window.Counts().RomCount, 10);  // 8 lines + mystery.zip + galaxian.zip
+}
+
+TEST_F(PlayFormTreeTest, CountLabelShowsArchivesAndTheirSize) {
+    PlayForm& window = Open();
+    auto* label = window.findChild<QLabel*>("Label15");
+    ASSERT_NE(label, nullptr);
+    // 7 lines of games.inc + mystery.zip; the archives counted and the readme's 10 bytes.
+    EXPECT_EQ(window.Counts().RomCount, 8);
+    EXPECT_EQ(window.Counts().RomBytes, 6 * 2048 + 10);  // the removed qbert.zip is skipped
+    EXPECT_EQ(label->text(), "8 ROMS (13 KB)");
+}
+
+}  // namespace
+}  // namespace qv::test
