@@ -60,6 +60,7 @@ QWidget* Stack(QWidget* parent, std::initializer_list<ClickLabel*> pictures) {
 DetailsPanel::DetailsPanel(QWidget* parent) : QWidget(parent) {
     setObjectName(QStringLiteral("DetailsPanel"));
     setMouseTracking(true);
+    setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Maximum);
     QPalette palette = this->palette();
     palette.setColor(QPalette::WindowText, PanelInk);
     setPalette(palette);
@@ -213,8 +214,7 @@ QWidget* DetailsPanel::BuildBottomRow() {
 }
 
 void DetailsPanel::Render(const DetailsState& state) {
-    const QString caption = QString::fromStdString(CaptionDisplayText(state.titleCaption));
-    if (title_->text() != caption) title_->setText(caption);
+    Show(title_, PanelText(CaptionDisplayText(state.titleCaption)));
     title_->setToolTip(QString::fromStdString(state.titleTooltip));
     Show(maker_, state.maker);
     Show(category_, state.category);
@@ -235,9 +235,9 @@ void DetailsPanel::Render(const DetailsState& state) {
     const int rating = state.rating >= 0 && state.rating <= 5 ? state.rating : 0;
     for (int i = 0; i < 6; ++i) ratings_[static_cast<std::size_t>(i)]->setVisible(i == rating);
 
-    resolution_->setText(QString::fromStdString(state.resolution));
+    Show(resolution_, PanelText(state.resolution));
     Show(executable_, state.executable);
-    version_->setText(QString::fromStdString(state.version));
+    Show(version_, PanelText(state.version));
     playN_->setVisible(state.play == PlayImage::Normal);
     playY_->setVisible(state.play == PlayImage::Active);
     playX_->setVisible(state.play == PlayImage::Disabled);

@@ -45,7 +45,7 @@ GameRoadController::GameRoadController(PlayForm& form, Program& program, SpeechE
       switches_(state_, program.gameRecords, program.options),
       speaker_(engine, program.options, *program.log),
       watch_(launcher) {
-    form.DetailsLayout()->insertWidget(0, panel_);
+    form.DetailsLayout()->insertWidget(0, panel_, 0, Qt::AlignTop);
 
     PlayFormHooks& hooks = form.Hooks();
     hooks.speak = [this](const std::string& text) { Speak(text); };
@@ -110,7 +110,7 @@ GameRoadController::GameRoadController(PlayForm& form, Program& program, SpeechE
 
 void GameRoadController::Speak(const std::string& text) {
     // Texts asked for while the window is still loading are dropped.
-    speaker_.SetReady(form_.SpeechReady());
+    speaker_.SetReady(form_.SpeechReady() && !quiet_);
     speaker_.Speak(text);
 }
 
@@ -119,7 +119,7 @@ void GameRoadController::FinishLoad() {
     // cycle, sound and joystick) belong to a load whose speech is not ready yet, so what they
     // would say is not said.
     Options& options = program_.options;
-    speaker_.SetReady(false);
+    quiet_ = true;
     RefreshExecutable();
     resolutions_.Build(options.Resolutions);
     state_.resolution = ResolutionCycle::kAuto;
@@ -128,6 +128,7 @@ void GameRoadController::FinishLoad() {
     if (options.Joystick && !state_.joystick.on)
         switches_.Click(PanelSwitch::Joystick, tree, NoNode);
     safeMode_ = !options.Windows2000XP;
+    quiet_ = false;
 
     speaker_.SetReady(form_.SpeechReady());
     speaker_.CheckVoice();
@@ -163,7 +164,17 @@ void GameRoadController::SelectNode(NodeId node) {
     if (result.folder) return;
     if (result.nodeChanged) NodeChanged(node);
     Render();
+    if (afterSelection) afterSelection(node, result);
     if (!result.titleToSpeak.empty()) Speak(MakeSpeakable(result.titleToSpeak));
+}
+
+void GameRoadController::ShowEditedTitle(const std::string& title, const std::string* makerLine) {
+    state_.titleCaption = DoubleAmpersands(title);
+    if (state_.titleCaption.size() > TitleCaptionLimit)
+        state_.titleCaption = state_.titleCaption.substr(0, TitleCaptionLimit) + "...";
+    state_.titleTooltip = title;
+    if (makerLine) state_.maker = PanelText(DoubleAmpersands(*makerLine), colours::Green);
+    Render();
 }
 
 void GameRoadController::ClickSwitch(PanelSwitch which) {

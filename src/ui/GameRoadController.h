@@ -1,8 +1,10 @@
 #pragma once
 #include <QObject>
 #include <QTimer>
+#include <functional>
 #include <string>
 
+#include "launch/DetailsSelection.h"
 #include "launch/DetailsState.h"
 #include "launch/GameWatch.h"
 #include "launch/PanelSwitches.h"
@@ -43,6 +45,12 @@ public:
     // The search box: Enter or the search icon.
     void SearchTree();
 
+    // Runs after the panel showed a game, before the title is spoken: the text view and the
+    // pictures follow the selection.
+    std::function<void(NodeId, const SelectionResult&)> afterSelection;
+    // The title label and, when given, the maker line (in green) show an edited title.
+    void ShowEditedTitle(const std::string& title, const std::string* makerLine);
+
 private:
     void Speak(const std::string& text);
     void FinishLoad();
@@ -69,6 +77,7 @@ private:
     NodeId selectedNode_ = NoNode;
     bool safeMode_ = false;
     bool currentEmulator_ = true;
+    bool quiet_ = false;  // load steps that run before speech is ready
 };
 
 }  // namespace qv
