@@ -2,10 +2,8 @@
 #include <QObject>
 #include <QTimer>
 #include <functional>
-#include <functional>
 #include <string>
 
-#include "launch/DetailsSelection.h"
 #include "launch/DetailsSelection.h"
 #include "launch/DetailsState.h"
 #include "launch/GameWatch.h"
@@ -46,12 +44,6 @@ public:
     void WatchTick();
     // The search box: Enter or the search icon.
     void SearchTree();
-
-    // Runs after the panel showed a game, before the title is spoken: the text view and the
-    // pictures follow the selection.
-    std::function<void(NodeId, const SelectionResult&)> afterSelection;
-    // The title label and, when given, the maker line (in green) show an edited title.
-    void ShowEditedTitle(const std::string& title, const std::string* makerLine);
 
     // Runs after the panel showed a game, before the title is spoken: the text view and the
     // pictures follow the selection.
