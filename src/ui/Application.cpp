@@ -19,7 +19,7 @@
 #include "platform/qt/QtSpeechEngine.h"
 #include "ui/AppFolder.h"
 #include "ui/GameRoadController.h"
-#include "ui/ReferenceController.h"
+#include "ui/HelpPages.h"
 #include "ui/PlayForm.h"
 #include "ui/Program.h"
 #include "ui/WaitWindow.h"
@@ -29,12 +29,16 @@ namespace qv {
 int RunQuorvane(int argc, char** argv) {
     QApplication app(argc, argv);
     QApplication::setApplicationName(QStringLiteral("Quorvane"));
+    // The program ends when the user confirms the quit question, not when the main window
+    // hides itself behind the help window or the about box.
+    QApplication::setQuitOnLastWindowClosed(false);
 
     const std::string home = QDir::homePath().toStdString();
     Program program;
     program.appFolder = ApplicationFolder(std::getenv("QUORVANE_HOME"),
                                           std::getenv("XDG_DATA_HOME"), home);
     PrepareApplicationFolder(program.appFolder);
+    EnsureHelpPages(program.appFolder);
     program.regional = std::make_unique<QtRegional>();
     program.clock = std::make_unique<SystemClock>();
     program.yield = std::make_unique<QtEventYield>();
@@ -57,8 +61,7 @@ int RunQuorvane(int argc, char** argv) {
     PosixProcessLauncher gameLauncher;
     WaitWindow wait(program.yield.get());
     PlayForm form(program, &wait);
-    auto* road = new GameRoadController(form, program, speech, gameLauncher);  // owned by the window
-    AttachReference(form, program, *road);
+    new GameRoadController(form, program, speech, gameLauncher);  // owned by the window
     QObject::connect(&form, &PlayForm::quitConfirmed, &app, [] { QCoreApplication::exit(0); });
 
     const auto configFile = program.appFolder / "config.inc";

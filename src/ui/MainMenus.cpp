@@ -71,10 +71,10 @@ MainMenus MainMenus::Build(QMenuBar* bar, QObject* owner) {
     m.mMinimize = Command(m.view, owner, "mMinimize", "Minimize", now);
 
     m.help = Menu(bar, "mHelpMenu", "&Help");
-    m.mHelp = Command(m.help, owner, "mHelp", "Quorvane Help", later);
-    m.mMAMEHelp = Command(m.help, owner, "mMAMEHelp", "MAME Tips", later);
+    m.mHelp = Command(m.help, owner, "mHelp", "Quorvane Help", now);
+    m.mMAMEHelp = Command(m.help, owner, "mMAMEHelp", "MAME Tips", now);
     m.help->addSeparator();
-    m.mAbout = Command(m.help, owner, "mAbout", "About Quorvane", later);
+    m.mAbout = Command(m.help, owner, "mAbout", "About Quorvane", now);
     return m;
 }
 

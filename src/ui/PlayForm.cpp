@@ -14,7 +14,9 @@
 #include "app/AppVersion.h"
 #include "catalogue/GameTreeBuilder.h"
 #include "catalogue/RomLibrary.h"
+#include "ui/AboutWindow.h"
 #include "ui/ClickLabel.h"
+#include "ui/HelpWindow.h"
 #include "ui/PlayFormStyle.h"
 #include "ui/TitleArea.h"
 #include "ui/TreePane.h"
@@ -75,6 +77,9 @@ void PlayForm::ConnectCommands() {
     connect(m.mFullScreen, &QAction::triggered, this, [this] { FullScreen(); });
     connect(m.mNormal, &QAction::triggered, this, [this] { MinimizeWindow(); });
     connect(m.mMinimize, &QAction::triggered, this, [this] { MinimizeWindow(); });
+    connect(m.mHelp, &QAction::triggered, this, [this] { ShowHelp("QUORVANE"); });
+    connect(m.mMAMEHelp, &QAction::triggered, this, [this] { ShowHelp("MAME"); });
+    connect(m.mAbout, &QAction::triggered, this, [this] { ShowAbout(); });
 
     connect(title_->Logo(), &ClickLabel::clicked, this, [this] { ShowMenuBar(!menuBarShown_); });
     connect(title_->Logo(), &ClickLabel::doubleClicked, this, [this] {
@@ -191,6 +196,27 @@ void PlayForm::FullScreen() {
 }
 
 void PlayForm::MinimizeWindow() { showMinimized(); }
+
+void PlayForm::ShowHelp(const std::string& topic) {
+    helpTopic_ = topic;
+    if (!help_) {
+        help_ = new HelpWindow(program_.appFolder, this);
+        help_->setObjectName(QStringLiteral("Help"));
+        connect(help_, &HelpWindow::closed, this, [this] { show(); });
+    }
+    hide();
+    help_->ShowTopic(topic);
+    help_->show();
+    help_->raise();
+}
+
+void PlayForm::ShowAbout() {
+    hide();
+    AboutWindow about([this](const std::string& text) { Speak(text); }, this);
+    about.setObjectName(QStringLiteral("About"));
+    about.exec();
+    FullScreen();
+}
 
 std::string PlayForm::CountCaption() const {
     return std::to_string(counts_.RomCount) + " ROMS (" +

@@ -13,6 +13,7 @@ class QVBoxLayout;
 
 namespace qv {
 
+class HelpWindow;
 class TitleArea;
 class TreePane;
 class WaitWindow;
@@ -51,6 +52,12 @@ public:
     void Refresh();
     void FullScreen();
     void MinimizeWindow();
+    // The help window ("QUORVANE": the program's help, "MAME": the emulator tips) replaces the
+    // main window until it is closed; the about box does so while it is open.
+    void ShowHelp(const std::string& topic);
+    void ShowAbout();
+    const std::string& HelpTopic() const { return helpTopic_; }
+    HelpWindow* Help() const { return help_; }
 
     // RomCount + " ROMS (" + SizeText(RomBytes) + ")".
     std::string CountCaption() const;
@@ -93,6 +100,8 @@ private:
     TreePane* pane_ = nullptr;
     QVBoxLayout* detailsLayout_ = nullptr;
     PlayFormHooks hooks_;
+    HelpWindow* help_ = nullptr;  // created on first use
+    std::string helpTopic_;
     RecordCounts counts_;
     bool menuBarShown_ = true;
     bool speechReady_ = false;

@@ -4,8 +4,13 @@
 #include <QTest>
 #include <QTreeView>
 
+#include <QApplication>
+#include <QTimer>
+
 #include "PlayFormFixture.h"
 #include "ui/ClickLabel.h"
+#include "ui/HelpPages.h"
+#include "ui/HelpWindow.h"
 
 namespace qv::test {
 namespace {
@@ -50,12 +55,8 @@ TEST_F(PlayFormMenuTest, MenusHaveTheirCommandsInOrderAndUnbuiltOnesAreOff) {
               (QStringList{"View My Hidden ROMs", "View My Working ROMs Only", "-",
                            "Add All Emulated Games", "-", "Full Screen", "Normal",
                            "Minimize"}));
-    const QStringList help = Captions(MenuNamed(window, "&Help"));
-    ASSERT_EQ(help.size(), 4);
-    EXPECT_TRUE(help[0].startsWith("Quorvane Help"));
-    EXPECT_TRUE(help[1].startsWith("MAME Tips"));
-    EXPECT_EQ(help[2], "-");
-    EXPECT_TRUE(help[3].startsWith("About Quorvane"));
+    EXPECT_EQ(Captions(MenuNamed(window, "&Help")),
+              (QStringList{"Quorvane Help", "MAME Tips", "-", "About Quorvane"}));
 
     for (const char* name : {"mSave", "mVoice", "mConfig", "mUpdate", "mDownloadSnaps",
                              "mMAMEConf", "mSafeMode", "mExit", "mRefresh", "mRename",
@@ -146,6 +147,40 @@ TEST_F(PlayFormMenuTest, DoubleClickOnAGameAsksToRunItButNotOnAFolder) {
     emit view->doubleClicked(NodeIndex("alpha_pacman.zip"));
     ASSERT_EQ(started.size(), 1u);
     EXPECT_EQ(window.Tree().Node(started[0]).Tag, "pacman.zip");
+}
+
+TEST_F(PlayFormMenuTest, HelpReplacesTheMainWindowUntilItCloses) {
+    EnsureHelpPages(home.path());
+    PlayForm& window = Open();
+    Command("mHelp")->trigger();
+    EXPECT_EQ(window.HelpTopic(), "QUORVANE");
+    ASSERT_NE(window.Help(), nullptr);
+    EXPECT_TRUE(window.isHidden());
+    EXPECT_TRUE(window.Help()->isVisible());
+    EXPECT_TRUE(window.Help()->CurrentPage().endsWith("help/quorvane.html"));
+
+    window.Help()->close();
+    EXPECT_FALSE(window.isHidden());
+
+    Command("mMAMEHelp")->trigger();
+    EXPECT_EQ(window.HelpTopic(), "MAME");
+    EXPECT_TRUE(window.Help()->CurrentPage().endsWith("help/mame.html"));
+    window.Help()->close();
+    EXPECT_FALSE(window.isHidden());
+}
+
+TEST_F(PlayFormMenuTest, AboutHidesTheMainWindowAndReturnsToFullScreen) {
+    PlayForm& window = Open();
+    window.ShowMenuBar(true);
+    bool hiddenWhileOpen = false;
+    QTimer::singleShot(0, [&] {
+        hiddenWhileOpen = window.isHidden();
+        if (QWidget* about = QApplication::activeModalWidget()) about->close();
+    });
+    Command("mAbout")->trigger();
+    EXPECT_TRUE(hiddenWhileOpen);
+    EXPECT_FALSE(window.isHidden());
+    EXPECT_FALSE(window.MenuBarShown());
 }
 
 }  // namespace
