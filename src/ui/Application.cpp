@@ -20,6 +20,7 @@
 #include "ui/AppFolder.h"
 #include "ui/GameRoadController.h"
 #include "ui/HelpPages.h"
+#include "ui/ReferenceController.h"
 #include "ui/PlayForm.h"
 #include "ui/Program.h"
 #include "ui/WaitWindow.h"
@@ -61,7 +62,8 @@ int RunQuorvane(int argc, char** argv) {
     PosixProcessLauncher gameLauncher;
     WaitWindow wait(program.yield.get());
     PlayForm form(program, &wait);
-    new GameRoadController(form, program, speech, gameLauncher);  // owned by the window
+    auto* road = new GameRoadController(form, program, speech, gameLauncher);  // owned by the window
+    AttachReference(form, program, *road);
     QObject::connect(&form, &PlayForm::quitConfirmed, &app, [] { QCoreApplication::exit(0); });
 
     const auto configFile = program.appFolder / "config.inc";
