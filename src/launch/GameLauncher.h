@@ -55,6 +55,9 @@ struct RunResult {
     ProcessId processId = 0;
 };
 
+// Safe Mode at start-up: on when the system is not of the NT family (Windows2000XP off).
+inline bool InitialSafeMode(const Options& options) { return !options.Windows2000XP; }
+
 // Starts the selected game: drops any watched game, builds the command for the detected
 // emulator generation (current: argument list; classic: the classic layout), sends the output
 // to logs/<key with ".zip" -> ".log">, logs "Play: " + title and the command, starts the
