@@ -32,7 +32,9 @@ FrameRateReport ReadFrameRate(const std::filesystem::path& logFile, const Region
 
 // The "Log" view of the text area.
 struct LogView {
-    std::string text;  // every line followed by CR LF, or "No log available..."
+    // Every line followed by CR LF, bytes as the emulator wrote them (show through
+    // DisplayUtf8), or "No log available...".
+    std::string text;
     bool found = false;  // true: colour RGB(128, 128, 255); false: red
 };
 LogView ReadLogView(const std::filesystem::path& logFile);
