@@ -120,7 +120,7 @@ void PlayForm::Load() {
         menus_.mNotes->setText(QStringLiteral("View Game Notes"));
     }
 
-    BuildTree();
+    RebuildTree();
     speechReady_ = true;
     if (hooks_.checkVoice) hooks_.checkVoice();
     ShowCount();
@@ -149,16 +149,16 @@ void PlayForm::SaveRomInformation() {
 void PlayForm::SetShowHidden(bool show) {
     program_.options.ShowHidden = show;
     menus_.mViewHidden->setChecked(show);
-    BuildTree();
+    RebuildTree();
 }
 
 void PlayForm::SetShowWorking(bool show) {
     program_.options.ShowWorking = show;
     menus_.mViewWorking->setChecked(show);
-    BuildTree();
+    RebuildTree();
 }
 
-void PlayForm::BuildTree() {
+void PlayForm::RebuildTree() {
     const SnapshotIndex snapshots(program_.options.SnapDir);
     pane_->ChangeTree([&] {
         qv::BuildGameTree(tree_, program_.gameRecords, program_.romLibrary, program_.options,
@@ -184,7 +184,7 @@ void PlayForm::Refresh() {
     ShowWait("Loading ...");
     counts_ = LoadGameRecords(program_.gameRecords, program_.options, program_.host,
                               *program_.log, Status());
-    BuildTree();
+    RebuildTree();
     ShowCount();
     CloseWait();
 }

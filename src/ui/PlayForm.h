@@ -49,6 +49,8 @@ public:
     void SetShowHidden(bool show);
     void SetShowWorking(bool show);
     void AddAllEmulatedGames();
+    // BuildGameTree shown in the view (load, Refresh and the view filters call it).
+    void RebuildTree();
     void Refresh();
     void FullScreen();
     void MinimizeWindow();
@@ -82,7 +84,6 @@ protected:
 private:
     void BuildLayout();
     void ConnectCommands();
-    void BuildTree();
     void ShowCount();
     void ShowWait(const std::string& status);
     void CloseWait();
