@@ -1,0 +1,289 @@
+#include <QApplication>
+#include <QImage>
+#include <QLabel>
+#include <QLineEdit>
+#include <QMouseEvent>
+#include <QTest>
+#include <QTreeView>
+
+#include "PlayFormFixture.h"
+#include "support/RecordingSpeechEngine.h"
+#include "ui/DetailsTextEdit.h"
+#include "ui/GameRoadController.h"
+#include "ui/PicturePanel.h"
+#include "ui/ReferenceController.h"
+#include "ui/ReferenceView.h"
+
+namespace qv::test {
+namespace {
+
+class NoLauncher final : public ProcessLauncher {
+public:
+    ProcessId Start(const LaunchRequest&) override { return 0; }
+    bool IsRunning(ProcessId) override { return false; }
+};
+
+const char* kHistory =
+    "$info=pacman,puckman,\r\n$bio\r\n\r\nPac-Man history.\r\n\r\nSecond line.\r\n$end\r\n"
+    "$info=galaga\r\n$bio\r\nGalaga history.\r\n$end\r\n";
+const char* kInfo = "$info=pacman\r\n$mame\r\n0.36b1\r\n$end\r\n";
+
+class ReferenceViewTest : public PlayFormFixture {
+protected:
+    void OpenWindow(bool withDatabases = true) {
+        if (withDatabases) {
+            program.options.HistoryFile = home.Write("history.dat", kHistory).string();
+            program.options.MameInfoFile = home.Write("mameinfo.dat", kInfo).string();
+        } else {
+            program.options.HistoryFile = (home / "nothere.dat").string();
+            program.options.MameInfoFile.clear();
+        }
+        program.options.Speak = true;
+        NoStatusDisplay status;
+        LoadRomLibrary(program.romLibrary, program.options.RomLibraryFile, *program.log, status);
+        form = std::make_unique<PlayForm>(program, nullptr);
+        road = new GameRoadController(*form, program, speech, launcher);
+        reference = AttachReference(*form, program, *road);
+        form->Load();
+        form->resize(1200, 800);
+        QApplication::processEvents();
+        speech.spoken.clear();
+    }
+    template <typename T = QWidget>
+    T* Control(const char* name) {
+        auto* control = form->findChild<T*>(QString::fromLatin1(name));
+        EXPECT_NE(control, nullptr) << name;
+        return control;
+    }
+    void Click(const char* name) {
+        QApplication::processEvents();  // lay out the tabs so a click lands inside them
+        QTest::mouseClick(Control(name), Qt::LeftButton);
+    }
+    void Select(const std::string& key) { form->Pane().View()->setCurrentIndex(NodeIndex(key)); }
+    DetailsTextEdit* TextArea() { return Control<DetailsTextEdit>("Text2"); }
+    QString Shown() { return TextArea()->toPlainText(); }
+    bool Visible(const char* name) { return !Control(name)->isHidden(); }
+
+    RecordingSpeechEngine speech;
+    NoLauncher launcher;
+    GameRoadController* road = nullptr;
+    ReferenceController* reference = nullptr;
+};
+
+TEST_F(ReferenceViewTest, HistoryAndInfoTabsShowEntriesAndFollowTheSelection) {
+    OpenWindow();
+    Select("alpha_pacman.zip");
+    Click("IHistory");
+    EXPECT_TRUE(Visible("IHistory2"));
+    EXPECT_FALSE(Visible("IHistory"));
+    EXPECT_EQ(Shown(), "Pac-Man history.\n\nSecond line.\n");
+    EXPECT_EQ(TextArea()->Marker(), "Hist");
+    EXPECT_TRUE(TextArea()->isReadOnly());
+    EXPECT_EQ(TextArea()->styleSheet().contains("rgb(128, 128, 255)"), true);
+
+    Select("alpha_galaga.zip");  // the chosen view is repeated for the new game
+    EXPECT_EQ(Shown(), "Galaga history.\n");
+    Select("alpha_digdug.zip");
+    EXPECT_EQ(Shown(), "No history data found for digdug.zip.");
+    EXPECT_TRUE(TextArea()->styleSheet().contains("rgb(255, 0, 0)"));
+
+    Select("alpha_pacman.zip");
+    Click("IMAMEInfo");
+    EXPECT_TRUE(Visible("IMAMEInfo2"));
+    EXPECT_TRUE(Visible("IHistory"));
+    EXPECT_FALSE(Visible("IHistory2"));
+    EXPECT_EQ(Shown(), "MAME 0.36b1\n");
+
+    // "View Game History" runs the history tab's handler.
+    Command("mHistory")->trigger();
+    EXPECT_EQ(TextArea()->Marker(), "Hist");
+
+    speech.spoken.clear();
+    QTest::mouseDClick(TextArea()->viewport(), Qt::LeftButton);
+    EXPECT_EQ(speech.Last(), "Pac-Man history.\r\n\r\nSecond line.\r\n");
+}
+
+TEST_F(ReferenceViewTest, MissingDatabasesAreMarkedAndOnlySpoken) {
+    OpenWindow(false);
+    EXPECT_EQ(Control("IHistory")->toolTip(), "Not found");
+    EXPECT_EQ(Control("IMAMEInfo")->toolTip(), "Not found");
+    EXPECT_EQ(Control("INotes")->toolTip(), "Notes");
+    Select("alpha_pacman.zip");
+    speech.spoken.clear();
+    Click("IHistory");
+    EXPECT_EQ(speech.Last(), "Cannot find history file.");
+    Click("IMAMEInfo");
+    EXPECT_EQ(speech.Last(), "No MAME Info file identified.");
+    EXPECT_TRUE(TextArea()->Marker().isEmpty());
+}
+
+TEST_F(ReferenceViewTest, NotesAreEditedStoredEscapedAndReachGamesInc) {
+    OpenWindow();
+    EXPECT_EQ(Command("mNotes")->text(), "Edit Game Notes");
+    Select("alpha_pacman.zip");
+    Click("INotes");
+    EXPECT_TRUE(Visible("INotes2"));
+    EXPECT_EQ(TextArea()->Marker(), "Notes");
+    EXPECT_FALSE(TextArea()->isReadOnly());
+    TextArea()->setFocus();
+    QTest::keyClicks(TextArea(), "Best: 3,333,360");
+    QTest::keyClick(TextArea(), Qt::Key_Return);
+    QTest::keyClick(TextArea(), Qt::Key_Tab);
+    QTest::keyClicks(TextArea(), "perfect");
+    Select("alpha_galaga.zip");  // the area changes content: the notes are stored
+    EXPECT_EQ(program.gameRecords.Item("pacman.zip")->Notes, "Best: 3,333,360<crlf><tab>perfect");
+    EXPECT_EQ(Shown(), "");
+    Select("alpha_pacman.zip");
+    EXPECT_EQ(Shown(), "Best: 3,333,360\n\tperfect");
+
+    Command("mSave")->trigger();
+    EXPECT_NE(home.Read("games.inc").find("Best: 3,333,360<crlf><tab>perfect"), std::string::npos);
+
+    // Double-clicking the notes tab shows the game log instead.
+    home.Write("logs/pacman.log", "Average FPS: 60.0\n");
+    QTest::mouseDClick(Control("INotes2"), Qt::LeftButton);
+    EXPECT_EQ(TextArea()->Marker(), "Log");
+    EXPECT_EQ(Shown(), "Average FPS: 60.0\n");
+    Command("mLog")->trigger();
+    EXPECT_EQ(Shown(), "Average FPS: 60.0\n");
+}
+
+TEST_F(ReferenceViewTest, NotesAreReadOnlyWhenEditingIsOff) {
+    program.options.Edit = false;
+    program.gameRecords.Clear();
+    OpenWindow();
+    EXPECT_EQ(Command("mNotes")->text(), "View Game Notes");
+    EXPECT_FALSE(Command("mDelete")->isEnabled());
+    EXPECT_FALSE(Command("mRename")->isEnabled());
+    EXPECT_TRUE(Command("mHistory")->isEnabled());
+    program.gameRecords.Item("pacman.zip")->Notes = "Kept<tab>as is";
+    Select("alpha_pacman.zip");
+    Command("mNotes")->trigger();
+    EXPECT_TRUE(TextArea()->isReadOnly());
+    EXPECT_EQ(Shown(), "Kept\tas is");
+    Click("IHistory");
+    EXPECT_EQ(program.gameRecords.Item("pacman.zip")->Notes, "Kept<tab>as is");
+}
+
+TEST_F(ReferenceViewTest, RenameInPlaceChangesTitleNodesAndSpeaksIt) {
+    OpenWindow();
+    Select("alpha_alpha_nothing");  // nothing selected yet: renaming the root is refused
+    form->Pane().View()->setCurrentIndex(NodeIndex("alpha_"));
+    Command("mRename")->trigger();
+    EXPECT_EQ(form->findChild<QLineEdit*>("TreeLabelEdit"), nullptr);
+
+    Select("alpha_pacman.zip");
+    Command("mRename")->trigger();
+    auto* editor = form->findChild<QLineEdit*>("TreeLabelEdit");
+    ASSERT_NE(editor, nullptr);
+    EXPECT_EQ(editor->text(), "Pac-Man");
+    editor->setText("Puck Man & Co");
+    speech.spoken.clear();
+    QTest::keyClick(editor, Qt::Key_Return);
+    EXPECT_EQ(program.gameRecords.Item("pacman.zip")->Title, "Puck Man & Co");
+    EXPECT_EQ(TextOf("alpha_pacman.zip"), "Puck Man & Co");
+    EXPECT_EQ(TextOf("Maze_pacman.zip"), "Puck Man & Co");
+    EXPECT_EQ(Control<QLabel>("Label1")->toolTip(), "Puck Man & Co");
+    EXPECT_EQ(speech.Last(), "Puck Man & Co");
+}
+
+TEST_F(ReferenceViewTest, DeleteInsertAndUpdateAllThroughTheEditMenu) {
+    OpenWindow();
+    Select("alpha_galaga.zip");
+    prompt->Answer(PromptAnswer::Yes);
+    prompt->Answer(PromptAnswer::No);  // keep the archive
+    Command("mDelete")->trigger();
+    ASSERT_EQ(prompt->asked.size(), 2u);
+    EXPECT_EQ(prompt->asked[0].text, "Are you sure you want to delete Galaga?");
+    EXPECT_EQ(prompt->asked[1].text, "Do you want to delete the ROM: galaga.zip?");
+    EXPECT_EQ(program.gameRecords.Item("galaga.zip")->RomFile, "^galaga.zip");
+    EXPECT_TRUE(std::filesystem::exists(home / "roms" / "galaga.zip"));
+    EXPECT_FALSE(form->Tree().NodeExists("alpha_galaga.zip"));
+    EXPECT_FALSE(NodeIndex("Shooter_galaga.zip").isValid());
+
+    program.gameRecords.Item("dkong.zip")->Title = "dkong.zip";
+    Select("alpha_digdug.zip");
+    program.gameRecords.Item("digdug.zip")->Title = "My Dig Dug";
+    QTest::mouseDClick(Control("Image1"), Qt::LeftButton);  // same as Insert MAME Information
+    EXPECT_EQ(program.gameRecords.Item("digdug.zip")->Title, "Dig Dug");
+    EXPECT_EQ(Control<QLabel>("Label3")->text(), "(C) 1982, Namco");
+
+    prompt->Answer(PromptAnswer::No);
+    Command("mUpdateAll")->trigger();
+    EXPECT_EQ(prompt->asked.back().text,
+              "Do you want to update all ROMs (yes) or unidentified (no)?");
+    EXPECT_EQ(program.gameRecords.Item("dkong.zip")->Title, "Donkey Kong");
+    EXPECT_TRUE(program.gameRecords.Item("dkong.zip")->Working);
+    EXPECT_EQ(TextOf("alpha_dkong.zip"), "Donkey Kong");
+    EXPECT_EQ(prompt->unexpected, 0);
+}
+
+QImage Picture(int width, int height, QColor colour) {
+    QImage image(width, height, QImage::Format_RGB32);
+    image.fill(colour);
+    return image;
+}
+
+void SendMouse(QWidget* widget, QEvent::Type type, QPoint at, Qt::MouseButton button,
+               Qt::MouseButtons buttons) {
+    QMouseEvent event(type, QPointF(at), widget->mapToGlobal(QPointF(at)), button, buttons,
+                      Qt::NoModifier);
+    QApplication::sendEvent(widget, &event);
+}
+
+TEST_F(ReferenceViewTest, PicturesAreLaidOutDraggedAndPutBack) {
+    program.options.MarqueeDir = (home / "marquee").string();
+    std::filesystem::create_directories(program.options.MarqueeDir);
+    ASSERT_TRUE(Picture(256, 224, Qt::blue).save(QString::fromStdString((home / "snap" / "pacman.png").string())));
+    ASSERT_TRUE(Picture(300, 60, Qt::yellow).save(QString::fromStdString((home / "marquee" / "pacman.png").string())));
+    ASSERT_TRUE(Picture(800, 100, Qt::green).save(QString::fromStdString((home / "snap" / "galaga.png").string())));
+    OpenWindow();
+    Select("alpha_pacman.zip");
+    Command("mScreenshot")->trigger();
+    EXPECT_TRUE(Visible("IScreen2"));
+    auto* marquee = Control("Picture1");
+    auto* shot = Control("Picture2");
+    EXPECT_TRUE(marquee->isVisibleTo(form.get()));
+    EXPECT_EQ(marquee->geometry(), QRect(90, 0, 300, 60));
+    EXPECT_EQ(shot->geometry(), QRect(112, 60, 256, 224));
+    EXPECT_FALSE(Visible("LabelNoScreenshot"));
+
+    // Drag the screenshot with the left button: it follows the pointer.
+    SendMouse(shot, QEvent::MouseButtonPress, {10, 10}, Qt::LeftButton, Qt::LeftButton);
+    SendMouse(shot, QEvent::MouseMove, {30, 25}, Qt::NoButton, Qt::LeftButton);
+    EXPECT_EQ(shot->pos(), QPoint(132, 75));
+    SendMouse(shot, QEvent::MouseButtonRelease, {15, 10}, Qt::LeftButton, Qt::NoButton);
+    EXPECT_EQ(shot->pos(), QPoint(137, 75));
+    // The right button drags nothing.
+    SendMouse(shot, QEvent::MouseButtonPress, {0, 0}, Qt::RightButton, Qt::RightButton);
+    SendMouse(shot, QEvent::MouseMove, {50, 50}, Qt::NoButton, Qt::RightButton);
+    EXPECT_EQ(shot->pos(), QPoint(137, 75));
+    QTest::mouseDClick(shot, Qt::LeftButton);
+    EXPECT_EQ(shot->pos(), QPoint(112, 60));
+
+    // A screenshot wider than the panel starts at the left edge; no marquee: centred.
+    Select("alpha_galaga.zip");
+    EXPECT_FALSE(marquee->isVisibleTo(form.get()));
+    EXPECT_EQ(shot->geometry(), QRect(0, 130, 800, 100));
+    EXPECT_TRUE(Visible("LabelNoScreenshot") == false);
+
+    Select("alpha_digdug.zip");
+    EXPECT_FALSE(shot->isVisibleTo(form.get()));
+    EXPECT_TRUE(Visible("LabelNoScreenshot"));
+    EXPECT_EQ(Control<QLabel>("LabelNoScreenshot")->text(), "No screenshot available.");
+    EXPECT_FALSE(Control("IDownSnap")->isEnabled());
+    EXPECT_FALSE(Control("LabelMarquee")->isEnabled());
+}
+
+TEST_F(ReferenceViewTest, MalformedPictureIsLoggedAndNeverEndsTheProgram) {
+    home.Write("snap/pacman.png", std::string("\x89PNG\r\n\x1a\n", 8) + std::string(40, '\xff'));
+    OpenWindow();
+    Select("alpha_pacman.zip");
+    Click("IScreen");
+    EXPECT_FALSE(Control("Picture2")->isVisibleTo(form.get()));
+    EXPECT_TRUE(Visible("LabelNoScreenshot"));
+    EXPECT_NE(home.Read("quorvane.log").find("PlayForm ShowPNG Error"), std::string::npos);
+}
+
+}  // namespace
+}  // namespace qv::test
