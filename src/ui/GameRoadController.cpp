@@ -127,7 +127,7 @@ void GameRoadController::FinishLoad() {
     if (options.Sound && !state_.sound.on) switches_.Click(PanelSwitch::Sound, tree, NoNode);
     if (options.Joystick && !state_.joystick.on)
         switches_.Click(PanelSwitch::Joystick, tree, NoNode);
-    safeMode_ = !options.Windows2000XP;
+    safeMode_ = InitialSafeMode(options);
     quiet_ = false;
 
     speaker_.SetReady(form_.SpeechReady());
