@@ -84,6 +84,7 @@ ReferenceView::ReferenceView(QWidget* parent) : QWidget(parent) {
     // Picture downloads arrive with the internet commands; until then they only show.
     auto* download = new QLabel(QStringLiteral("Download:"), this);
     download->setObjectName(QStringLiteral("LabelDownload"));
+    download->setStyleSheet(QStringLiteral("color: rgb(170, 175, 210);"));
     row->addWidget(download);
     for (auto [icon, label, caption] :
          {std::tuple{"IDownMarquee", "LabelMarquee", "Marquee"},
