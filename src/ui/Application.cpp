@@ -6,11 +6,6 @@
 #include <QScreen>
 #include <cstdlib>
 
-#include "app/EmulatorVersion.h"
-#include "app/OptionsFile.h"
-#include "app/RunHeader.h"
-#include "app/TextFile.h"
-#include "catalogue/RomLibrary.h"
 #include "platform/PosixHostInfo.h"
 #include "platform/PosixProcessLauncher.h"
 #include "platform/qt/QtEventYield.h"
@@ -23,6 +18,7 @@
 #include "ui/ReferenceController.h"
 #include "ui/PlayForm.h"
 #include "ui/Program.h"
+#include "ui/StartUp.h"
 #include "ui/WaitWindow.h"
 
 namespace qv {
@@ -45,17 +41,11 @@ int RunQuorvane(int argc, char** argv) {
     program.yield = std::make_unique<QtEventYield>();
     program.prompt = std::make_unique<QtPrompt>();
     program.OpenLog();
-    ActivityLog& log = *program.log;
-    log.SetEnabled(true);
 
     PosixHostInfo hostInfo(program.prompt.get());
     QSize screen(0, 0);
     if (const QScreen* primary = QGuiApplication::primaryScreen()) screen = primary->size();
-    WriteRunHeader(log, hostInfo, screen.width(), screen.height(), *program.regional,
-                   *program.clock);
-
-    Options& options = program.options;
-    SetDefaults(options, program.appFolder, program.host, home, &hostInfo);
+    BeginRun(program, hostInfo, screen.width(), screen.height(), home);
 
     // The speech engine and the game launcher outlive the window that uses them.
     QtSpeechEngine speech;
@@ -66,23 +56,8 @@ int RunQuorvane(int argc, char** argv) {
     AttachReference(form, program, *road);
     QObject::connect(&form, &PlayForm::quitConfirmed, &app, [] { QCoreApplication::exit(0); });
 
-    const auto configFile = program.appFolder / "config.inc";
-    if (FileExists(configFile)) {
-        wait.show();
-        wait.SetStatus("Initializing ...");
-        LoadOptions(options, configFile, log, wait);
-        PosixProcessLauncher launcher;
-        EmulatorVersionCheck versionCheck(options, program.appFolder, program.host, log,
-                                          launcher, *program.yield);
-        program.mameVersion = versionCheck.GetMAMEVer(options.MameExec, true);
-        LoadRomLibrary(program.romLibrary, options.RomLibraryFile, log, wait);
-    } else {
-        // No settings yet. Until the first-run wizard exists the window opens on the built-in
-        // defaults, with the library the wizard would have read.
-        SetDefaults(options, program.appFolder, program.host, home, &hostInfo);
-        LoadRomLibrary(program.romLibrary, options.RomLibraryFile, log, wait);
-    }
-    form.Load();
+    PosixProcessLauncher versionLauncher;
+    OpenFirstWindow(program, hostInfo, home, versionLauncher, wait, form);
     return app.exec();
 }
 
