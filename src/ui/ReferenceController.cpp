@@ -86,6 +86,10 @@ ReferenceController::ReferenceController(PlayForm& form, Program& program, Refer
     connect(menus.mUpdateAll, &QAction::triggered, this, &ReferenceController::UpdateAll);
     RenderText();
     RenderPictures();
+    // The window opens on the pictures, so the first selected game shows its screenshot.
+    view_->ResetViewTabs();
+    view_->SelectViewTab(ViewTab::Screen);
+    view_->ShowImagePanel();
 }
 
 void ReferenceController::MarkMissingDatabases() {
