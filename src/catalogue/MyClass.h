@@ -3,7 +3,6 @@
 #include <memory>
 #include <string>
 #include <string_view>
-#include <unordered_map>
 #include <vector>
 
 namespace qv {
@@ -42,6 +41,7 @@ public:
     std::string StoredLine;
 
     MyClass() = default;
+    ~MyClass();
     MyClass(const MyClass&) = delete;
     MyClass& operator=(const MyClass&) = delete;
     MyClass(MyClass&&) noexcept = default;
@@ -51,7 +51,9 @@ public:
     const std::string& Key() const { return key_; }
     void SetKey(std::string key);
 
-    std::int32_t Count() const { return static_cast<std::int32_t>(items_.size()); }
+    std::int32_t Count() const {
+        return inner_ ? static_cast<std::int32_t>(inner_->order.size()) : 0;
+    }
 
     // Removes by key or by 1-based position; throws std::out_of_range when there is none.
     void Delete(std::string_view key);
@@ -83,31 +85,59 @@ public:
     public:
         explicit BasicIterator(Inner it) : it_(it) {}
         Item& operator*() const { return **it_; }
-        Item* operator->() const { return it_->get(); }
+        Item* operator->() const { return *it_; }
         BasicIterator& operator++() { ++it_; return *this; }
         bool operator==(const BasicIterator& other) const { return it_ == other.it_; }
         bool operator!=(const BasicIterator& other) const { return it_ != other.it_; }
     private:
         Inner it_;
     };
-    using Items = std::vector<std::unique_ptr<MyClass>>;
-    using iterator = BasicIterator<MyClass, Items::iterator>;
-    using const_iterator = BasicIterator<const MyClass, Items::const_iterator>;
-    iterator begin() { return iterator(items_.begin()); }
-    iterator end() { return iterator(items_.end()); }
-    const_iterator begin() const { return const_iterator(items_.cbegin()); }
-    const_iterator end() const { return const_iterator(items_.cend()); }
+    using iterator = BasicIterator<MyClass, MyClass* const*>;
+    using const_iterator = BasicIterator<const MyClass, const MyClass* const*>;
+    iterator begin() { return iterator(First()); }
+    iterator end() { return iterator(First() + Count()); }
+    const_iterator begin() const { return const_iterator(First()); }
+    const_iterator end() const { return const_iterator(First() + Count()); }
 
     // Case-folded form of a key, as used for lookups.
     static std::string FoldKey(std::string_view key);
 
 private:
-    void ReindexFrom(std::size_t first);
+    // An item's own collection exists only once something is added to it, so that the many
+    // items that never hold others carry one empty pointer instead of a whole empty table.
+    struct Collection {
+        // Items live in chunks that never move, so callers may keep pointers across Adds.
+        struct Chunk {
+            MyClass* items = nullptr;
+            std::size_t capacity = 0;
+        };
+        // Open addressing over positions in `order`; keys are compared with the items' own.
+        struct Slot {
+            std::uint32_t hash = 0;
+            std::uint32_t position = 0;  // 1-based; 0 = empty slot
+        };
+        std::vector<MyClass*> order;  // insertion order
+        std::vector<Chunk> chunks;
+        std::size_t usedInLastChunk = 0;
+        std::vector<MyClass*> freed;  // destroyed items whose storage may be used again
+        std::vector<Slot> slots;      // size is a power of two, at most half full
+
+        Collection() = default;
+        Collection(const Collection&) = delete;
+        Collection& operator=(const Collection&) = delete;
+        ~Collection();
+    };
+
+    MyClass* const* First() const { return inner_ ? inner_->order.data() : nullptr; }
+    Collection& Inner();
+    const MyClass* Find(std::string_view key, std::uint32_t hash, std::size_t& slot) const;
+    MyClass* NewItem();
+    void GrowIndex(std::size_t count);
+    void RebuildIndex();
 
     std::string key_;
     bool keySet_ = false;
-    Items items_;
-    std::unordered_map<std::string, std::size_t> index_;  // folded key -> position (0-based)
+    std::unique_ptr<Collection> inner_;
 };
 
 }  // namespace qv
