@@ -1,6 +1,6 @@
 #include "catalogue/RomLibrary.h"
 
-#include <array>
+#include <algorithm>
 #include <cmath>
 
 #include "app/TextFile.h"
@@ -54,8 +54,9 @@ void LoadRomLibrary(MyClass& library, const std::string& libraryFile, ActivityLo
         log.WriteLog("Cannot read MAME ROMs Library: " + libraryFile);
         return;
     }
-    // Roughly one entry per 64 bytes; reserving avoids rehashing the key index while loading.
-    library.Reserve(static_cast<std::size_t>(library.Count()) + bytes->size() / 64 + 16);
+    // At most one entry per line; reserving avoids regrowing the key index while loading.
+    const auto lines = static_cast<std::size_t>(std::count(bytes->begin(), bytes->end(), '\n'));
+    library.Reserve(static_cast<std::size_t>(library.Count()) + lines + 1);
     std::string key;
     ForEachLine(*bytes, [&](std::string_view raw) {
         const std::string_view line = TrimSpaces(raw);

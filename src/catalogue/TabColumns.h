@@ -1,5 +1,8 @@
 #pragma once
 #include <array>
+#include <bit>
+#include <cstdint>
+#include <cstring>
 #include <cstddef>
 #include <string>
 #include <string_view>
@@ -12,16 +15,23 @@ template <std::size_t N>
 class TabColumns {
 public:
     explicit TabColumns(std::string_view line) {
+        static_assert(N > 0);
         std::size_t start = 0;
-        while (count_ < N) {
-            const std::size_t tab = line.find('\t', start);
-            if (tab == std::string_view::npos) {
-                columns_[count_++] = line.substr(start);
-                break;
+        std::size_t at = 0;
+        // Eight bytes at a time: every tab in the word is a column end.
+        if constexpr (std::endian::native == std::endian::little) {
+            for (; at + 8 <= line.size(); at += 8) {
+                std::uint64_t word;
+                std::memcpy(&word, line.data() + at, 8);
+                for (std::uint64_t tabs = TabBytes(word); tabs != 0; tabs &= tabs - 1) {
+                    const std::size_t tab = at + (static_cast<std::size_t>(std::countr_zero(tabs)) >> 3);
+                    if (EndColumn(line, start, tab)) return;
+                }
             }
-            columns_[count_++] = line.substr(start, tab - start);
-            start = tab + 1;
         }
+        for (; at < line.size(); ++at)
+            if (line[at] == '\t' && EndColumn(line, start, at)) return;
+        columns_[count_++] = line.substr(start);
     }
 
     bool Has(std::size_t index) const { return index < count_; }
@@ -32,22 +42,49 @@ public:
     }
 
 private:
+    // 0x80 in each byte of the word that is a tab, 0 elsewhere.
+    static std::uint64_t TabBytes(std::uint64_t word) {
+        constexpr std::uint64_t low7 = 0x7f7f7f7f7f7f7f7full;
+        const std::uint64_t x = word ^ 0x0909090909090909ull;
+        return ~(((x & low7) + low7) | x | low7);
+    }
+
+    // Records the column that ends at the tab; true once N columns are there.
+    bool EndColumn(std::string_view line, std::size_t& start, std::size_t tab) {
+        columns_[count_++] = line.substr(start, tab - start);
+        start = tab + 1;
+        return count_ == N;
+    }
+
     std::array<std::string_view, N> columns_{};
     std::size_t count_ = 0;
 };
 
-// out = text with every '"' removed; copies the runs between quotes rather than byte by byte.
+// out = text with every '"' removed. Most texts have quotes only around them, or none: those
+// are assigned in one piece.
 inline void AssignWithoutQuotes(std::string& out, std::string_view text) {
+    std::size_t first = 0;
+    std::size_t last = text.size();
+    if (last >= 2 && text.front() == '"' && text.back() == '"') {
+        ++first;
+        --last;
+    }
+    std::size_t quote = first;
+    while (quote < last && text[quote] != '"') ++quote;
+    if (quote == last) {
+        out.assign(text.data() + first, last - first);
+        return;
+    }
     out.clear();
     std::size_t start = 0;
     for (;;) {
-        const std::size_t quote = text.find('"', start);
-        if (quote == std::string_view::npos) {
+        const std::size_t next = text.find('"', start);
+        if (next == std::string_view::npos) {
             out.append(text.substr(start));
             return;
         }
-        out.append(text.substr(start, quote - start));
-        start = quote + 1;
+        out.append(text.substr(start, next - start));
+        start = next + 1;
     }
 }
 
