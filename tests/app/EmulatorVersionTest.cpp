@@ -43,20 +43,23 @@ struct VersionFixture : LogFixture {
 }  // namespace
 
 TEST(VersionFromBanner, ClassicAndCurrentBanners) {
-    const auto classic =
-        VersionFromBanner("M.A.M.E. v0.78 (Nov  1 2003) - Multiple Arcade Machine Emulator");
-    EXPECT_EQ(classic.text, "0.78");
-    EXPECT_FALSE(classic.current);
-    EXPECT_EQ(VersionFromBanner("M.A.M.E. v0.100 (Oct 2005) - Multiple Arcade Machine Emulator")
-                  .text,
-              "0.10");
-    const auto current = VersionFromBanner("MAME v0.251 (unknown)");
-    EXPECT_EQ(current.text, "0.251");
-    EXPECT_TRUE(current.current);
-    EXPECT_EQ(VersionFromBanner("MAME v").text, "#N/A");
-    EXPECT_EQ(VersionFromBanner("0.251 (unknown)").text, "#N/A");
-    EXPECT_EQ(VersionFromBanner("multiple arcade machine emulator 0.78").text, "#N/A");
-    EXPECT_EQ(VersionFromBanner("").text, "#N/A");
+    const struct { const char* banner; const char* text; bool current; } cases[] = {
+        {"M.A.M.E. v0.78 (Nov  1 2003) - Multiple Arcade Machine Emulator", "0.78", false},
+        {"M.A.M.E. v0.100 (Oct 2005) - Multiple Arcade Machine Emulator", "0.10", false},
+        {"MAME v0.251 (unknown)", "0.251", true},
+        {"MAME v", "#N/A", false},
+        {"0.251 (unknown)", "#N/A", false},
+        {"multiple arcade machine emulator 0.78", "#N/A", false},
+        {"", "#N/A", false},
+    };
+    for (const auto& c : cases) {
+        SCOPED_TRACE(c.banner);
+        const auto version = VersionFromBanner(c.banner);
+        EXPECT_EQ(version.text, c.text);
+        if (version.text != "#N/A") {
+            EXPECT_EQ(version.current, c.current);
+        }
+    }
 }
 
 TEST(EmulatorVersionCheck, RunsEmulatorWithHelpAndReadsBothGenerations) {

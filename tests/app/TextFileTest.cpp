@@ -14,51 +14,39 @@ TEST(TextFile, LinesEndInCrLfOrLfAndLastLineNeedsNoEnd) {
     EXPECT_EQ(SplitLines("x\ry\n"), (std::vector<std::string>{"x\ry"}));
 }
 
-TEST(TextFile, AtomicWriteReplacesContent) {
+TEST(TextFile, AtomicWriteReplacesContentOrKeepsTheOldFile) {
     TempDir dir;
     const auto file = dir / "config.inc";
     EXPECT_EQ(WriteFileAtomically(file, "one\r\n"), "");
     EXPECT_EQ(WriteFileAtomically(file, "two\r\n"), "");
     EXPECT_EQ(ReadAll(file), "two\r\n");
-    // No temporary file is left behind.
-    EXPECT_EQ(std::distance(std::filesystem::directory_iterator(dir.path()), {}), 1);
-}
-
-TEST(TextFile, AtomicWriteKeepsOldFileWhenFolderIsReadOnly) {
-    if (::geteuid() == 0) GTEST_SKIP() << "permissions do not bind root";
-    TempDir dir;
-    const auto file = dir.Write("config.inc", "old\r\n");
-    std::filesystem::permissions(dir.path(), std::filesystem::perms::owner_read |
-                                                 std::filesystem::perms::owner_exec);
-    EXPECT_NE(WriteFileAtomically(file, "new\r\n"), "");
-    std::filesystem::permissions(dir.path(), std::filesystem::perms::owner_all);
-    EXPECT_EQ(ReadAll(file), "old\r\n");
-}
-
-TEST(TextFile, AtomicWriteKeepsOldFileWhenRenameFails) {
-    TempDir dir;
     // A non-empty folder where the file should go: the rename over it fails.
     dir.Write("target/inside.txt", "keep");
     EXPECT_NE(WriteFileAtomically(dir / "target", "new"), "");
     EXPECT_EQ(dir.Read("target/inside.txt"), "keep");
-    EXPECT_EQ(std::distance(std::filesystem::directory_iterator(dir.path()), {}), 1);
+    // No temporary file is left behind either way.
+    EXPECT_EQ(std::distance(std::filesystem::directory_iterator(dir.path()), {}), 2);
+
+    if (::geteuid() == 0) return;  // permissions do not bind root
+    std::filesystem::permissions(dir.path(), std::filesystem::perms::owner_read |
+                                                 std::filesystem::perms::owner_exec);
+    EXPECT_NE(WriteFileAtomically(file, "new\r\n"), "");
+    std::filesystem::permissions(dir.path(), std::filesystem::perms::owner_all);
+    EXPECT_EQ(ReadAll(file), "two\r\n");
 }
 
 TEST(TextFile, DisplayUtf8KeepsUtf8AndReadsOtherBytesAsWindows1252) {
     EXPECT_EQ(DisplayUtf8("Caf\xC3\xA9"), "Caf\xC3\xA9");
     EXPECT_EQ(DisplayUtf8("Caf\xE9"), "Caf\xC3\xA9");
     EXPECT_EQ(DisplayUtf8("\x80 5"), "\xE2\x82\xAC 5");
-    EXPECT_EQ(DisplayUtf8("plain"), "plain");
 }
 
 TEST(TextFile, FileExistsOnlyForFiles) {
     TempDir dir;
     EXPECT_FALSE(FileExists(dir.path()));
     EXPECT_FALSE(FileExists(dir / "none"));
-    EXPECT_TRUE(FileExists(dir.Write("a.txt", "")));
     EXPECT_FALSE(FileExists(""));
-    EXPECT_STREQ(YesNo(true), "Yes");
-    EXPECT_STREQ(YesNo(false), "No");
+    EXPECT_TRUE(FileExists(dir.Write("a.txt", "")));
 }
 
 }  // namespace qv::test

@@ -16,11 +16,12 @@ public:
     std::time_t Now() const override { return 1079537400; }
 };
 
-// A wait window that is shown and remembers every status text it was given.
+// A wait window (shown unless told otherwise) that remembers every status text it was given.
 class RecordingStatus final : public StatusDisplay {
 public:
-    bool IsVisible() const override { return true; }
+    bool IsVisible() const override { return visible; }
     void SetStatus(const std::string& text) override { texts.push_back(text); }
+    bool visible = true;
     std::vector<std::string> texts;
 };
 

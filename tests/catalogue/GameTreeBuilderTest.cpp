@@ -6,18 +6,12 @@
 #include <string>
 #include <vector>
 
-#include "support/TempDir.h"
+#include "CatalogueTestSupport.h"
 
 namespace qv {
 namespace {
 
-class RecordingStatus final : public StatusDisplay {
-public:
-    bool IsVisible() const override { return visible; }
-    void SetStatus(const std::string& text) override { texts.push_back(text); }
-    bool visible = true;
-    std::vector<std::string> texts;
-};
+using test::RecordingStatus;
 
 class GameTreeBuilderTest : public ::testing::Test {
 protected:
@@ -80,21 +74,12 @@ TEST_F(GameTreeBuilderTest, RootsCarryKeysTextsImagesAndChildCounts) {
     Build();
 
     EXPECT_EQ(NodeOf("alpha_").Text, " Alphabetical (3)");
-    EXPECT_EQ(NodeOf("alpha_").Image, "fclosed");
-    EXPECT_EQ(NodeOf("alpha_").ExpandedImage, "fopen");
     EXPECT_EQ(NodeOf("Maze_").Text, "Maze (2)");
-    EXPECT_EQ(NodeOf("Maze_").Image, "fclosed");
-    EXPECT_EQ(NodeOf("Maze_").ExpandedImage, "fopen");
+    EXPECT_EQ(NodeOf("Maze_").Image + NodeOf("Maze_").ExpandedImage, "fclosedfopen");
     // No record of Galaga, and Mystery has no category: no further roots.
     EXPECT_EQ(tree.Find("Shooter_"), NoNode);
     EXPECT_EQ(tree.ChildCount(NoNode), 2);
     EXPECT_EQ(tree.Count(), 2 + 3 + 2);
-
-    // The leading space puts the alphabetical root first; children are sorted by title.
-    EXPECT_EQ(tree.Node(tree.Children(NoNode)[0]).Key, "alpha_");
-    std::vector<std::string> titles;
-    for (const NodeId id : tree.Children(tree.Find("alpha_"))) titles.push_back(tree.Node(id).Text);
-    EXPECT_EQ(titles, (std::vector<std::string>{"Donkey Kong", "Mystery", "Pac-Man"}));
 
     const TreeNode& game = NodeOf("Maze_pacman.zip");
     EXPECT_EQ(game.Text, "Pac-Man");
@@ -110,8 +95,11 @@ TEST_F(GameTreeBuilderTest, GameColoursFollowWorkingPresentAndScreenshot) {
     MyClass& pacman = Record("pacman.zip", "Pac-Man");
     Record("galaga.zip", "Galaga");
     Record("dkong.zip", "Donkey Kong", /*working=*/false);
+    snap.Write("frogger.png", "png");
+    Record("Frogger.zip", "Frogger");  // the screenshot name keeps the record's case
     Build();
 
+    EXPECT_EQ(NodeOf("alpha_Frogger.zip").Colour, colours::LightBlue);
     EXPECT_EQ(NodeOf("alpha_pacman.zip").Colour, colours::Black);
     EXPECT_EQ(NodeOf("alpha_pacman.zip").Image, "good");
     EXPECT_EQ(NodeOf("Maze_pacman.zip").Colour, colours::Black);
@@ -127,13 +115,6 @@ TEST_F(GameTreeBuilderTest, GameColoursFollowWorkingPresentAndScreenshot) {
     EXPECT_EQ(NodeOf("alpha_pacman.zip").Image, "bad");
     EXPECT_EQ(NodeOf("Maze_pacman.zip").Colour, colours::Grey);
     EXPECT_FALSE(pacman.Working);
-}
-
-TEST_F(GameTreeBuilderTest, ScreenshotNameKeepsTheRecordsCase) {
-    snap.Write("pacman.png", "png");
-    Record("PacMan.zip", "Pac-Man");
-    Build();
-    EXPECT_EQ(NodeOf("alpha_PacMan.zip").Colour, colours::LightBlue);
 }
 
 TEST_F(GameTreeBuilderTest, HiddenAndWorkingFilters) {
@@ -163,27 +144,21 @@ TEST_F(GameTreeBuilderTest, HiddenAndWorkingFilters) {
     EXPECT_EQ(NodeOf("alpha_").Text, " Alphabetical (2)");
 }
 
-TEST_F(GameTreeBuilderTest, UnidentifiedArchiveSurvivesFiltersUnderAlphabeticalOnly) {
+TEST_F(GameTreeBuilderTest, OddRecordsUnknownRemovedAndUnderscoreNamed) {
     options.ShowWorking = true;
-    // Still named by its file: the library does not know it, so it has no category either.
+    // Unidentified: still named by its file, no category, survives both filters.
     MyClass& unknown = Record("unknown.zip", "unknown.zip", /*working=*/false);
     unknown.Hidden = true;
+    // Removed during an earlier run: never shown, even with hidden games shown.
+    Entry("pacman.zip", "Pac-Man", "Maze");
+    Record("pacman.zip", "^pacman.zip").RomFile = "^pacman.zip";
+    Record("odd_", "Odd Game");  // a name ending in "_" is a game, not a root
     Build();
     EXPECT_EQ(NodeOf("alpha_unknown.zip").Text, "unknown.zip");
     EXPECT_EQ(NodeOf("alpha_unknown.zip").Colour, colours::Red);
-    EXPECT_EQ(tree.ChildCount(NoNode), 1);
-}
-
-TEST_F(GameTreeBuilderTest, RemovedRecordsAreNeverShown) {
-    options.ShowHidden = true;
-    Entry("pacman.zip", "Pac-Man", "Maze");
-    MyClass& removed = *records.Add("pacman.zip");
-    removed.RomFile = "^pacman.zip";
-    removed.Title = "^pacman.zip";  // even an unidentified one
-    removed.Present = true;
-    Build();
-    EXPECT_EQ(tree.Count(), 1);
-    EXPECT_EQ(NodeOf("alpha_").Text, " Alphabetical (0)");
+    EXPECT_EQ(NodeOf("alpha_odd_").Text, "Odd Game");
+    EXPECT_EQ(NodeOf("alpha_").Text, " Alphabetical (2)");
+    EXPECT_EQ(tree.Count(), 3);
 }
 
 TEST_F(GameTreeBuilderTest, RebuildReplacesEverythingIncludingAllGamesRoot) {
@@ -197,12 +172,6 @@ TEST_F(GameTreeBuilderTest, RebuildReplacesEverythingIncludingAllGamesRoot) {
     Build();
     EXPECT_EQ(tree.Find("MAME.ROMS"), NoNode);
     EXPECT_EQ(NodeOf("Maze_").Text, "Maze (1)");  // counted once, not " (1) (1)"
-}
-
-TEST_F(GameTreeBuilderTest, GameFileNameEndingInUnderscoreIsNotCountedAsRoot) {
-    Record("odd_", "Odd Game");
-    Build();
-    EXPECT_EQ(NodeOf("alpha_odd_").Text, "Odd Game");
 }
 
 TEST_F(GameTreeBuilderTest, AddGameNodeIgnoresEmptyGroupAndDuplicates) {
@@ -234,36 +203,25 @@ TEST_F(GameTreeBuilderTest, AllGamesNodesColouredByOwnershipAndScreenshot) {
     ASSERT_TRUE(AddAllEmulatedGames(tree, library, records, SnapshotIndex(snap.path().string()),
                                     status, yield));
 
-    const TreeNode& root = NodeOf("MAME.ROMS");
-    EXPECT_EQ(root.Text, "All MAME ROMs");
-    EXPECT_EQ(root.Image, "fclosed");
-    EXPECT_EQ(root.ExpandedImage, "fopen");
+    EXPECT_EQ(NodeOf("MAME.ROMS").Text, "All MAME ROMs");
     EXPECT_EQ(tree.ChildCount(tree.Find("MAME.ROMS")), 5);
-
-    EXPECT_EQ(NodeOf("MAME.ROMS_PACMAN.zip").Colour, colours::Black);
-    EXPECT_EQ(NodeOf("MAME.ROMS_PACMAN.zip").Image, "good");
     EXPECT_EQ(NodeOf("MAME.ROMS_PACMAN.zip").Tag, "PACMAN.zip");
-    EXPECT_EQ(NodeOf("MAME.ROMS_dkong.zip").Colour, colours::LightBlue);
-    EXPECT_EQ(NodeOf("MAME.ROMS_dkong.zip").Image, "good");
-    EXPECT_EQ(NodeOf("MAME.ROMS_mspacman.zip").Colour, colours::Grey);
-    EXPECT_EQ(NodeOf("MAME.ROMS_mspacman.zip").Image, "");
-    EXPECT_EQ(NodeOf("MAME.ROMS_galaga.zip").Colour, colours::Blue);
-    EXPECT_EQ(NodeOf("MAME.ROMS_galaga.zip").Image, "bad");
-    EXPECT_EQ(NodeOf("MAME.ROMS_frogger.zip").Colour, colours::Grey);
-    EXPECT_EQ(NodeOf("MAME.ROMS_frogger.zip").Image, "bad");
+    const struct { const char* key; Rgb colour; const char* image; } rows[] = {
+        {"PACMAN.zip", colours::Black, "good"},   {"dkong.zip", colours::LightBlue, "good"},
+        {"mspacman.zip", colours::Grey, ""},      {"galaga.zip", colours::Blue, "bad"},
+        {"frogger.zip", colours::Grey, "bad"},
+    };
+    for (const auto& row : rows) {
+        SCOPED_TRACE(row.key);
+        EXPECT_EQ(NodeOf(std::string("MAME.ROMS_") + row.key).Colour, row.colour);
+        EXPECT_EQ(NodeOf(std::string("MAME.ROMS_") + row.key).Image, row.image);
+    }
     EXPECT_TRUE(status.texts.empty());  // fewer than 100 entries: no progress
     EXPECT_EQ(yield.yields, 0);
-}
-
-TEST_F(GameTreeBuilderTest, AllGamesRootIsAddedOnlyOnce) {
-    Entry("pacman.zip", "Pac-Man", "Maze");
-    NoStatusDisplay status;
-    NoEventYield yield;
-    EXPECT_TRUE(AddAllEmulatedGames(tree, library, records, SnapshotIndex(), status, yield));
+    // The root is added only once.
     const auto count = tree.Count();
     EXPECT_FALSE(AddAllEmulatedGames(tree, library, records, SnapshotIndex(), status, yield));
     EXPECT_EQ(tree.Count(), count);
-    EXPECT_EQ(tree.ChildCount(NoNode), 1);
 }
 
 TEST_F(GameTreeBuilderTest, AllGamesReportsProgressEveryHundredEntries) {
