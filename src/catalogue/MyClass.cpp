@@ -117,7 +117,7 @@ const MyClass* MyClass::Find(std::string_view key, std::uint32_t hash, std::size
 
 void MyClass::GrowIndex(std::size_t count) {
     std::size_t size = 16;
-    while (size < count * 2) size *= 2;
+    while (size * 3 < count * 4) size *= 2;  // at most three quarters full
     if (size <= inner_->slots.size()) return;
     inner_->slots.resize(size);
     RebuildIndex();
@@ -201,7 +201,7 @@ const MyClass* MyClass::Item(std::int32_t position) const {
 MyClass* MyClass::Add(std::string key) {
     Collection& c = Inner();
     const std::uint32_t hash = KeyHash(key);
-    if (c.slots.size() < (c.order.size() + 1) * 2) GrowIndex(c.order.size() + 1);
+    if (c.slots.size() * 3 < (c.order.size() + 1) * 4) GrowIndex(c.order.size() + 1);
     // The index slot is rarely in cache in a large collection: ask for it now and build the
     // new item meanwhile. A taken key (rare) gives the item's storage back.
     PrefetchSlot(c.slots.data() + (hash & (c.slots.size() - 1)));

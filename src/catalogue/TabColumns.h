@@ -14,9 +14,9 @@ namespace qv {
 template <std::size_t N>
 class TabColumns {
 public:
-    explicit TabColumns(std::string_view line) {
+    explicit TabColumns(std::string_view line) : line_(line) {
         static_assert(N > 0);
-        std::size_t start = 0;
+        starts_[0] = 0;
         std::size_t at = 0;
         // Eight bytes at a time: every tab in the word is a column end.
         if constexpr (std::endian::native == std::endian::little) {
@@ -25,20 +25,21 @@ public:
                 std::memcpy(&word, line.data() + at, 8);
                 for (std::uint64_t tabs = TabBytes(word); tabs != 0; tabs &= tabs - 1) {
                     const std::size_t tab = at + (static_cast<std::size_t>(std::countr_zero(tabs)) >> 3);
-                    if (EndColumn(line, start, tab)) return;
+                    if (EndColumn(tab)) return;
                 }
             }
         }
         for (; at < line.size(); ++at)
-            if (line[at] == '\t' && EndColumn(line, start, at)) return;
-        columns_[count_++] = line.substr(start);
+            if (line[at] == '\t' && EndColumn(at)) return;
+        EndColumn(line.size());
     }
 
     bool Has(std::size_t index) const { return index < count_; }
     std::size_t Count() const { return count_; }
     // An absent column reads as empty.
     std::string_view operator[](std::size_t index) const {
-        return index < count_ ? columns_[index] : std::string_view();
+        if (index >= N || index >= count_) return {};
+        return std::string_view(line_.data() + starts_[index], starts_[index + 1] - 1 - starts_[index]);
     }
 
 private:
@@ -50,13 +51,14 @@ private:
     }
 
     // Records the column that ends at the tab; true once N columns are there.
-    bool EndColumn(std::string_view line, std::size_t& start, std::size_t tab) {
-        columns_[count_++] = line.substr(start, tab - start);
-        start = tab + 1;
+    bool EndColumn(std::size_t end) {
+        starts_[++count_] = end + 1;
         return count_ == N;
     }
 
-    std::array<std::string_view, N> columns_{};
+    std::string_view line_;
+    // Column i runs from starts_[i] to the tab before starts_[i + 1]; the first count_ + 1 are set.
+    std::array<std::size_t, N + 1> starts_;
     std::size_t count_ = 0;
 };
 
