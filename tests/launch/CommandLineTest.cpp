@@ -1,4 +1,6 @@
 // The emulator command: classic texts under Windows conventions, the current argument list.
+// The switch conditions (cheats need the file, artwork the folder) are shared by both layouts
+// and checked once, on the classic text.
 #include <gtest/gtest.h>
 
 #include <algorithm>
@@ -177,20 +179,6 @@ TEST_F(CurrentCommandTest, ControllerFileOnlyWhenItsCfgExists) {
     auto at = std::find(args.begin(), args.end(), "-ctrlr");
     ASSERT_NE(at, args.end());
     EXPECT_EQ(*(at + 1), "DEFAULT");
-}
-
-TEST_F(CurrentCommandTest, CheatsNeedSwitchAndFileAndArtworkNeedsSwitchAndFolder) {
-    options.CheatsFile = (dir / "cheat.dat").string();
-    options.ArtworkDir = "/art";
-    switches.Cheats = true;
-    Args args = Command().arguments;
-    EXPECT_EQ(std::count(args.begin(), args.end(), "-cheat"), 0);  // the file is missing
-    EXPECT_EQ(std::count(args.begin(), args.end(), "-artpath"), 0);  // the switch is off
-    dir.Write("cheat.dat", "");
-    switches.Artwork = true;
-    args = Command().arguments;
-    EXPECT_EQ(std::count(args.begin(), args.end(), "-cheat"), 1);
-    EXPECT_EQ(std::count(args.begin(), args.end(), "-artpath"), 1);
 }
 
 TEST_F(CurrentCommandTest, UnsafeArchiveNameStaysOneArgumentAndLogTextQuotesIt) {

@@ -9,9 +9,8 @@
 namespace qv {
 namespace {
 
-class DetailsSelectionTest : public ::testing::Test {
-protected:
-    DetailsSelectionTest() {
+struct Details {
+    Details() {
         folder_ = tree_.Add(NoNode, "All", "All Games (3)", "fclosed", "fopen");
         options_.ArtworkDir = (temp_.path() / "artwork").string();
         std::filesystem::create_directories(options_.ArtworkDir);
@@ -60,6 +59,8 @@ protected:
     bool executableFound_ = true;
 };
 
+struct DetailsSelectionTest : ::testing::Test, Details {};
+
 TEST_F(DetailsSelectionTest, OwnedGameFillsEveryLine) {
     MyClass& game = Owned("pacman.zip", "Pac-Man");
     game.Year = "1980";
@@ -98,57 +99,52 @@ TEST_F(DetailsSelectionTest, OwnedGameFillsEveryLine) {
     EXPECT_TRUE(result.refreshPictures);
 }
 
-TEST_F(DetailsSelectionTest, PlaysLineSingularPluralAndRounding) {
-    MyClass& game = Owned("a.zip", "A");
-    NodeId node = GameNode("a.zip");
-    game.LastPlayed = "x";
-
-    Select(node);
-    EXPECT_EQ(state_.plays, (PanelText{"Never played", colours::Red}));
-
-    game.Plays = 1;
-    game.PlaySeconds = 89;
-    Select(node);
-    EXPECT_EQ(state_.plays.text, "1 play (1 min), Last Played: x");
-
-    game.Plays = 2;
-    game.PlaySeconds = 29;
-    Select(node);
-    EXPECT_EQ(state_.plays.text, "2 plays (0 min), Last Played: x");
-}
-
-TEST_F(DetailsSelectionTest, MakerNeedsBothYearAndCompanyAndDoublesAmpersands) {
-    MyClass& game = Owned("a.zip", "A");
-    NodeId node = GameNode("a.zip");
-    game.Company = "Acme";
-    Select(node);
-    EXPECT_EQ(state_.maker, (PanelText{"Manufacturer information not available", colours::Red}));
-
-    game.Year = "1982";
-    game.Company = "Cops & Co";
-    Select(node);
-    EXPECT_EQ(state_.maker.text, "(C) 1982, Cops && Co");
-}
-
-TEST_F(DetailsSelectionTest, TitleIsEscapedAndCutAfterFortyCharacters) {
-    MyClass& game = Owned("a.zip", std::string(40, 'x'));
-    NodeId node = GameNode("a.zip");
-    Select(node);
-    EXPECT_EQ(state_.titleCaption, std::string(40, 'x'));
-
-    game.Title = std::string(41, 'y');
-    Select(node);
-    EXPECT_EQ(state_.titleCaption, std::string(40, 'y') + "...");
-    EXPECT_EQ(state_.titleTooltip, std::string(41, 'y'));
-
-    // The doubled ampersands count towards the limit.
-    game.Title = "Tom & Jerry " + std::string(27, 'z');  // 39 characters, 40 once escaped
-    Select(node);
-    EXPECT_EQ(state_.titleCaption, "Tom && Jerry " + std::string(27, 'z'));
-    EXPECT_EQ(CaptionDisplayText(state_.titleCaption), game.Title);
-    game.Title += "!";
-    Select(node);
-    EXPECT_EQ(state_.titleCaption, "Tom && Jerry " + std::string(27, 'z') + "...");
+// One line of the panel for one owned game, set up by the row.
+TEST(DetailsSelectionRules, PanelLinesFollowTheirFormattingRules) {
+    using Set = void (*)(MyClass&);
+    using Get = std::string (*)(const DetailsState&);
+    const Get plays = [](const DetailsState& s) { return s.plays.text; };
+    const Get maker = [](const DetailsState& s) { return s.maker.text; };
+    const Get title = [](const DetailsState& s) { return s.titleCaption; };
+    const Get rating = [](const DetailsState& s) { return std::to_string(s.rating); };
+    const Get resolution = [](const DetailsState& s) { return s.resolution; };
+    const struct {
+        Set set;
+        Get get;
+        std::string expected;
+    } rows[] = {
+        {[](MyClass& g) { g.LastPlayed = "x"; }, plays, "Never played"},
+        {[](MyClass& g) { g.Plays = 1, g.PlaySeconds = 89, g.LastPlayed = "x"; }, plays,
+         "1 play (1 min), Last Played: x"},
+        {[](MyClass& g) { g.Plays = 2, g.PlaySeconds = 29, g.LastPlayed = "x"; }, plays,
+         "2 plays (0 min), Last Played: x"},
+        {[](MyClass& g) { g.Company = "Acme"; }, maker, "Manufacturer information not available"},
+        {[](MyClass& g) { g.Year = "1982", g.Company = "Cops & Co"; }, maker,
+         "(C) 1982, Cops && Co"},
+        {[](MyClass& g) { g.Title = std::string(40, 'x'); }, title, std::string(40, 'x')},
+        {[](MyClass& g) { g.Title = std::string(41, 'y'); }, title, std::string(40, 'y') + "..."},
+        {[](MyClass& g) { g.Title = "Tom & Jerry " + std::string(27, 'z'); }, title,
+         "Tom && Jerry " + std::string(27, 'z')},
+        {[](MyClass& g) { g.Title = "Tom & Jerry " + std::string(27, 'z') + "!"; }, title,
+         "Tom && Jerry " + std::string(27, 'z') + "..."},
+        {[](MyClass& g) { g.Rating = "*****"; }, rating, "5"},
+        {[](MyClass& g) { g.Rating = "******"; }, rating, "0"},
+        {[](MyClass& g) { g.Resolution = "640 x 480"; }, resolution, "640 x 480"},
+        {[](MyClass&) {}, resolution, "Auto"},
+    };
+    for (const auto& row : rows) {
+        SCOPED_TRACE(row.expected);
+        Details d;
+        MyClass& game = d.Owned("a.zip", "A");
+        row.set(game);
+        d.Select(d.GameNode("a.zip"));
+        EXPECT_EQ(row.get(d.state_), row.expected);
+        if (row.get == resolution) EXPECT_EQ(game.Resolution, row.expected);  // stored too
+    }
+    Details d;
+    d.Owned("a.zip", std::string(41, 'y'));
+    d.Select(d.GameNode("a.zip"));
+    EXPECT_EQ(d.state_.titleTooltip, std::string(41, 'y'));  // the tooltip keeps it whole
 }
 
 TEST_F(DetailsSelectionTest, WithoutLibraryEntryStatusIsRedAndCategoryStays) {
@@ -188,12 +184,10 @@ TEST_F(DetailsSelectionTest, WorkingFlagSetsSwitchNodeAndPlayImage) {
     EXPECT_EQ(tree_.Node(node).Image, "bad");
     EXPECT_EQ(state_.play, PlayImage::Disabled);
     EXPECT_EQ(state_.archive.colour, colours::Red);
-}
 
-TEST_F(DetailsSelectionTest, MissingExecutableDisablesPlay) {
-    Owned("a.zip", "A");
-    executableFound_ = false;
-    Select(GameNode("a.zip"));
+    game.Working = game.Present = true;
+    executableFound_ = false;  // no emulator: nothing can be played
+    Select(node);
     EXPECT_EQ(state_.play, PlayImage::Disabled);
 }
 
@@ -216,57 +210,25 @@ TEST_F(DetailsSelectionTest, ArtworkArchiveSetsMarkOtherwiseArtworkIsForcedOff) 
     EXPECT_TRUE(state_.artworkMark);  // only ever set
 }
 
-TEST_F(DetailsSelectionTest, EmptyResolutionIsShownAndStoredAsAuto) {
-    MyClass& game = Owned("a.zip", "A");
-    NodeId node = GameNode("a.zip");
-    Select(node);
-    EXPECT_EQ(state_.resolution, "Auto");
-    EXPECT_EQ(game.Resolution, "Auto");
-    game.Resolution = "640 x 480";
-    Select(node);
-    EXPECT_EQ(state_.resolution, "640 x 480");
-}
-
-TEST_F(DetailsSelectionTest, RatingFromAsterisksTooManyShowsNone) {
-    MyClass& game = Owned("a.zip", "A");
-    NodeId node = GameNode("a.zip");
-    game.Rating = "*****";
-    Select(node);
-    EXPECT_EQ(state_.rating, 5);
-    game.Rating = "******";
-    Select(node);
-    EXPECT_EQ(state_.rating, 0);
-}
-
 TEST_F(DetailsSelectionTest, LibraryOnlyGameShowsOffSwitchesAndNoKey) {
     MyClass& entry = Library("galaga.zip", "Galaga");
     entry.Year = "1981";
     entry.Company = "Namco";
-    entry.EmuSound = true;
-    entry.FileSize = 0;
     NodeId node = GameNode("galaga.zip");
-    state_.frameRate.colour = colours::Blue;
-    state_.rating = 4;
-    state_.resolution = "800 x 600";
     Owned("a.zip", "A").Mouse = true;
     Select(GameNode("a.zip"));
     state_.frameRate.colour = colours::Blue;
 
     SelectionResult result = Select(node);
-    EXPECT_TRUE(state_.selectedGameKey.empty());
-    EXPECT_EQ(state_.titleCaption, "Galaga");
+    EXPECT_TRUE(state_.selectedGameKey.empty());  // nothing to edit or run
     EXPECT_EQ(state_.maker.text, "(C) 1981, Namco");
     EXPECT_EQ(state_.plays, (PanelText{"Never played", colours::Red}));
     EXPECT_EQ(state_.archive, (PanelText{"ROM: galaga.zip, 0 KB", colours::Red}));
-    EXPECT_EQ(state_.emuSound, colours::Green);
-    EXPECT_FALSE(state_.working.on);
-    EXPECT_FALSE(state_.mouse.on);
     EXPECT_EQ(state_.mouse.label, (PanelText{"Mouse Off", colours::Red}));
     EXPECT_EQ(tree_.Node(node).Image, "bad");
     EXPECT_EQ(state_.play, PlayImage::Disabled);
-    EXPECT_EQ(state_.rating, 0);
     EXPECT_EQ(state_.frameRate.colour, colours::Blue);  // colour left alone
-    EXPECT_EQ(state_.resolution, "Auto");                // from the owned game before
+    EXPECT_EQ(state_.resolution, "Auto");
     EXPECT_EQ(result.textView, TextViewRefresh::NotesHistoryInfo);
     EXPECT_EQ(result.titleToSpeak, "Galaga");
 }

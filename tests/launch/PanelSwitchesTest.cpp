@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
+
 #include "support/TempDir.h"
 
 namespace qv {
@@ -52,23 +54,6 @@ TEST_F(PanelSwitchesTest, GuardedSwitchesOnlySpeakWithoutGameOrEditing) {
     EXPECT_FALSE(Game().Working);
 }
 
-TEST_F(PanelSwitchesTest, MouseAndHiddenFlipStoreAndSpeak) {
-    SelectGame();
-    EXPECT_EQ(Click(PanelSwitch::Mouse).spoken, "Mouse enabled");
-    EXPECT_TRUE(state_.mouse.on);
-    EXPECT_TRUE(Game().Mouse);
-    EXPECT_EQ(state_.mouse.label, (PanelText{"Mouse On", colours::Green}));
-    EXPECT_EQ(Click(PanelSwitch::Mouse).spoken, "Mouse disabled");
-    EXPECT_FALSE(Game().Mouse);
-    EXPECT_EQ(state_.mouse.label, (PanelText{"Mouse Off", colours::Red}));
-
-    EXPECT_EQ(Click(PanelSwitch::Hidden).spoken, "Hidden");
-    EXPECT_TRUE(Game().Hidden);
-    EXPECT_EQ(state_.hidden.label, (PanelText{"Hidden", colours::Green}));
-    EXPECT_EQ(Click(PanelSwitch::Hidden).spoken, "Not hidden");
-    EXPECT_EQ(state_.hidden.label, (PanelText{"Not Hidden", colours::Red}));
-}
-
 TEST_F(PanelSwitchesTest, WorkingNeedsThePresentArchiveAndRecolorsTheNode) {
     SelectGame();
     Game().Present = false;
@@ -107,58 +92,62 @@ TEST_F(PanelSwitchesTest, GameWithoutRecordIsNotEdited) {
     EXPECT_EQ(state_.rating, 0);
 }
 
-TEST_F(PanelSwitchesTest, CheatsNeedAnExistingCheatsFile) {
+// Each two-state switch, allowed to change: on, then off, with its words and its stored value.
+TEST_F(PanelSwitchesTest, SwitchesFlipStoreSpeakAndRelabel) {
+    SelectGame();
+    temp_.Write("cheat.dat", "x");
+    options_.CheatsFile = (temp_.path() / "cheat.dat").string();
+    state_.artworkMark = true;
+    options_.Sound = options_.Joystick = false;
+    const struct {
+        PanelSwitch which;
+        SwitchView DetailsState::*view;
+        std::function<bool()> stored;
+        const char *onSaid, *onLabel, *offSaid, *offLabel;
+    } rows[] = {
+        {PanelSwitch::Mouse, &DetailsState::mouse, [&] { return Game().Mouse; }, "Mouse enabled",
+         "Mouse On", "Mouse disabled", "Mouse Off"},
+        {PanelSwitch::Hidden, &DetailsState::hidden, [&] { return Game().Hidden; }, "Hidden",
+         "Hidden", "Not hidden", "Not Hidden"},
+        {PanelSwitch::Sound, &DetailsState::sound, [&] { return options_.Sound; },
+         "Sound enabled", "Sound On", "Sound disabled", "Sound Off"},
+        {PanelSwitch::Joystick, &DetailsState::joystick, [&] { return options_.Joystick; },
+         "Joystick enabled", "Joystick On", "Joystick disabled", "Joystick Off"},
+        {PanelSwitch::Cheats, &DetailsState::cheats, [&] { return state_.Run().Cheats; },
+         "Cheats enabled", "Cheats On", "Cheats disabled", "Cheats Off"},
+        {PanelSwitch::Artwork, &DetailsState::artwork, [&] { return state_.Run().Artwork; },
+         "Artwork Enabled", "Use Artwork", "Artwork disabled", "No Artwork"},
+    };
+    for (const auto& row : rows) {
+        SCOPED_TRACE(row.onSaid);
+        EXPECT_EQ(Click(row.which).spoken, row.onSaid);
+        EXPECT_TRUE(row.stored());
+        EXPECT_EQ((state_.*row.view).label, (PanelText{row.onLabel, colours::Green}));
+        EXPECT_EQ(Click(row.which).spoken, row.offSaid);
+        EXPECT_FALSE(row.stored());
+        EXPECT_EQ((state_.*row.view).label, (PanelText{row.offLabel, colours::Red}));
+    }
+}
+
+TEST_F(PanelSwitchesTest, CheatsNeedTheFileArtworkNeedsTheMark) {
     EXPECT_EQ(Click(PanelSwitch::Cheats).spoken, "No cheats file identified.");
     options_.CheatsFile = (temp_.path() / "cheat.dat").string();
     EXPECT_EQ(Click(PanelSwitch::Cheats).spoken, "Cannot find cheats file.");
     EXPECT_FALSE(state_.cheats.on);
-
-    temp_.Write("cheat.dat", "x");
-    EXPECT_EQ(Click(PanelSwitch::Cheats).spoken, "Cheats enabled");
-    EXPECT_EQ(state_.cheats.label, (PanelText{"Cheats On", colours::Green}));
-    EXPECT_TRUE(state_.Run().Cheats);
+    state_.cheats.on = true;
     options_.CheatsFile.clear();  // switching off never needs the file
     EXPECT_EQ(Click(PanelSwitch::Cheats).spoken, "Cheats disabled");
-    EXPECT_EQ(state_.cheats.label, (PanelText{"Cheats Off", colours::Red}));
-    EXPECT_FALSE(state_.Run().Cheats);
-}
 
-TEST_F(PanelSwitchesTest, ArtworkNeedsTheMark) {
     EXPECT_EQ(Click(PanelSwitch::Artwork).spoken, "Can not find artwork");
     EXPECT_FALSE(state_.artwork.on);
-    state_.artworkMark = true;
-    EXPECT_EQ(Click(PanelSwitch::Artwork).spoken, "Artwork Enabled");
-    EXPECT_EQ(state_.artwork.label, (PanelText{"Use Artwork", colours::Green}));
-    EXPECT_TRUE(state_.Run().Artwork);
-    EXPECT_EQ(Click(PanelSwitch::Artwork).spoken, "Artwork disabled");
-    EXPECT_EQ(state_.artwork.label, (PanelText{"No Artwork", colours::Red}));
-}
-
-TEST_F(PanelSwitchesTest, SoundAndJoystickChangeOptionsWithoutAGame) {
-    options_.Sound = false;
-    EXPECT_EQ(Click(PanelSwitch::Sound).spoken, "Sound enabled");
-    EXPECT_TRUE(options_.Sound);
-    EXPECT_EQ(state_.sound.label, (PanelText{"Sound On", colours::Green}));
-    EXPECT_EQ(Click(PanelSwitch::Sound).spoken, "Sound disabled");
-    EXPECT_FALSE(options_.Sound);
-    EXPECT_EQ(state_.sound.label, (PanelText{"Sound Off", colours::Red}));
-
-    options_.Joystick = false;
-    EXPECT_EQ(Click(PanelSwitch::Joystick).spoken, "Joystick enabled");
-    EXPECT_TRUE(options_.Joystick);
-    EXPECT_EQ(state_.joystick.label, (PanelText{"Joystick On", colours::Green}));
-    EXPECT_EQ(Click(PanelSwitch::Joystick).spoken, "Joystick disabled");
-    EXPECT_FALSE(options_.Joystick);
 }
 
 TEST_F(PanelSwitchesTest, PriorityAndWindowOnlyColourTheirFixedLabels) {
-    SwitchResult result = Click(PanelSwitch::Priority);
-    EXPECT_TRUE(result.spoken.empty());
+    EXPECT_TRUE(Click(PanelSwitch::Priority).spoken.empty());
     EXPECT_EQ(state_.priority.label, (PanelText{"High Priority", colours::Green}));
     EXPECT_TRUE(state_.Run().Priority);
     Click(PanelSwitch::Priority);
     EXPECT_EQ(state_.priority.label, (PanelText{"High Priority", colours::Red}));
-
     Click(PanelSwitch::Window);
     EXPECT_EQ(state_.window.label, (PanelText{"Windowed", colours::Green}));
     EXPECT_TRUE(state_.Run().Window);

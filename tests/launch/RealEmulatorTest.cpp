@@ -38,26 +38,25 @@ TEST(RealEmulatorTest, PongRunsThroughRunGameAndIsCountedAndReported) {
     if (!fs::exists("/usr/games/mame")) GTEST_SKIP() << "no emulator at /usr/games/mame";
 
     test::LaunchFixture f;
-    ASSERT_EQ(kEmptyZip.size(), 22u);
-    f.app.Write("roms/pong.zip", kEmptyZip);
-    f.app.Write("home/.mame/mame.ini", "video none\nsound none\nseconds_to_run 2\n");
-    ScopedHome home(f.app / "home");
+    f.dir.Write("roms/pong.zip", kEmptyZip);
+    f.dir.Write("home/.mame/mame.ini", "video none\nsound none\nseconds_to_run 2\n");
+    ScopedHome home(f.dir / "home");
     f.UseEmulator("/usr/games/mame");
 
-    EmulatorVersionCheck check(f.options, f.app.path(), HostConventions::Posix(), f.log,
+    EmulatorVersionCheck check(f.options, f.dir.path(), HostConventions::Posix(), f.log,
                                f.launcher, f.yield);
     const EmulatorVersion version = check.Detect(f.options.MameExec, true);
     EXPECT_EQ(version.text, "0.251");
     EXPECT_TRUE(version.current);
 
     // Every option of the current layout, so the emulator has to accept each of them.
-    const std::string d = f.app.path().string();
-    f.app.Write("mame/cheat.dat", "");
-    f.app.Write("mame/ctrlr/pad.cfg",
+    const std::string d = f.dir.path().string();
+    f.dir.Write("mame/cheat.dat", "");
+    f.dir.Write("mame/ctrlr/pad.cfg",
                 "<?xml version=\"1.0\"?>\n<mameconfig version=\"10\">\n"
                 "<system name=\"default\">\n</system>\n</mameconfig>\n");
     for (const char* folder : {"mame/snap", "mame/artwork", "mame/samples", "mame/sta"})
-        fs::create_directories(f.app / folder);
+        fs::create_directories(f.dir / folder);
     f.options.CheatsFile = d + "/mame/cheat.dat";
     f.options.CtrlrDir = d + "/mame/ctrlr";
     f.options.CtrlrFile = "pad.zip";
@@ -75,7 +74,7 @@ TEST(RealEmulatorTest, PongRunsThroughRunGameAndIsCountedAndReported) {
     request.switches = {true, true, true, true};
     request.resolution = "640 x 480";
     request.selectedGameKey = "pong.zip";
-    request.romFolder = (f.app / "roms").string();
+    request.romFolder = (f.dir / "roms").string();
     request.currentEmulator = version.current;
     const RunResult result = RunGame(request, f.Services());
     ASSERT_EQ(result.outcome, RunOutcome::Started) << f.LogText();
@@ -89,7 +88,7 @@ TEST(RealEmulatorTest, PongRunsThroughRunGameAndIsCountedAndReported) {
     EXPECT_GE(end.seconds, 2);
     EXPECT_EQ(game.PlaySeconds, end.seconds);
 
-    const fs::path gameLog = f.app / "logs" / "pong.log";
+    const fs::path gameLog = f.dir / "logs" / "pong.log";
     const std::string output = test::ReadAll(gameLog);
     EXPECT_NE(output.find("Average speed: "), std::string::npos) << output;
     EXPECT_EQ(output.find("Error: unknown option"), std::string::npos) << output;

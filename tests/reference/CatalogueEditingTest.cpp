@@ -8,7 +8,7 @@
 #include "reference/CatalogueEditing.h"
 #include "reference/CategoryList.h"
 #include "support/ScriptedPrompt.h"
-#include "ReferenceFixture.h"
+#include "support/FixedLog.h"
 
 namespace qv {
 namespace {

@@ -9,7 +9,7 @@
 #include "reference/ReferenceIndex.h"
 #include "reference/ReferenceScan.h"
 #include "reference/ReferenceViews.h"
-#include "ReferenceFixture.h"
+#include "support/FixedLog.h"
 
 namespace qv {
 namespace {

@@ -1,10 +1,11 @@
 #include <gtest/gtest.h>
 
 #include <optional>
+#include <string>
 
 #include "app/TextFile.h"
 #include "reference/PictureLayout.h"
-#include "ReferenceFixture.h"
+#include "support/FixedLog.h"
 
 namespace qv {
 namespace {
@@ -48,33 +49,27 @@ TEST(PictureLayoutRules, MarqueeOnTopScreenshotBelowOrCentred) {
     EXPECT_EQ(marquee.Top, 0);
     EXPECT_EQ(marquee.Width, 200);
     EXPECT_EQ(marquee.DrawX, 0);
-
-    PictureBox shot = PlaceScreenshot(panel, {256, 224}, marquee);
-    EXPECT_EQ(shot.Left, 72);
-    EXPECT_EQ(shot.Top, 50);
-    EXPECT_EQ(shot.Height, 224);
-
-    PictureBox none;  // no marquee: centred vertically
-    shot = PlaceScreenshot(panel, {256, 224}, none);
-    EXPECT_EQ(shot.Top, 38);
-    // Halves round to even: (400 - 255) / 2 = 72.5 -> 72, (300 - 223) / 2 = 38.5 -> 38.
-    shot = PlaceScreenshot(panel, {255, 223}, none);
-    EXPECT_EQ(shot.Left, 72);
-    EXPECT_EQ(shot.Top, 38);
-    shot = PlaceScreenshot(panel, {253, 221}, none);
-    EXPECT_EQ(shot.Left, 74);  // 73.5 -> 74
-    EXPECT_EQ(shot.Top, 40);   // 39.5 -> 40
-
-    // Wider than the panel: left edge 0; taller: top may go negative when centred.
-    shot = PlaceScreenshot(panel, {640, 480}, none);
-    EXPECT_EQ(shot.Left, 0);
-    EXPECT_EQ(shot.Top, 0);
-    // A marquee taller than the panel: the screenshot is centred instead of pushed below.
-    const PictureBox tall = PlaceMarquee(panel, {100, 350});
-    shot = PlaceScreenshot(panel, {100, 100}, tall);
-    EXPECT_EQ(shot.Top, 100);
-    shot = PlaceScreenshot(panel, {100, 400}, tall);
-    EXPECT_EQ(shot.Top, -50);
+    const PictureBox none, tall = PlaceMarquee(panel, {100, 350});
+    const struct {
+        PixelSize shot;
+        const PictureBox& marquee;
+        int left, top;
+    } rows[] = {
+        {{256, 224}, marquee, 72, 50},  // below the marquee
+        {{256, 224}, none, 72, 38},     // no marquee: centred vertically
+        {{255, 223}, none, 72, 38},     // halves round to even: 72.5 -> 72, 38.5 -> 38
+        {{253, 221}, none, 74, 40},     // 73.5 -> 74, 39.5 -> 40
+        {{640, 480}, none, 0, 0},       // larger than the panel: never above or left of it
+        {{100, 100}, tall, 150, 100},   // a marquee taller than the panel: centred instead
+        {{100, 400}, tall, 150, -50},
+    };
+    for (const auto& row : rows) {
+        SCOPED_TRACE(std::to_string(row.shot.width) + "x" + std::to_string(row.shot.height));
+        const PictureBox shot = PlaceScreenshot(panel, row.shot, row.marquee);
+        EXPECT_EQ(shot.Left, row.left);
+        EXPECT_EQ(shot.Top, row.top);
+        EXPECT_EQ(shot.Height, row.shot.height);
+    }
 }
 
 struct Pictures : test::LogFixture {

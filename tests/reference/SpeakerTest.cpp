@@ -1,9 +1,8 @@
 // The main window's voice: when it speaks, the voice check and its log lines.
 #include <gtest/gtest.h>
 
-#include "reference/ReferenceFixture.h"
+#include "support/FixedLog.h"
 #include "reference/Speaker.h"
-#include "reference/VoiceToggle.h"
 #include "support/RecordingSpeechEngine.h"
 
 namespace qv {
@@ -82,13 +81,6 @@ TEST_F(SpeakerTest, NoVoicesOrNoEngineSwitchSpeechOff) {
     EXPECT_FALSE(second.CheckVoice());
     EXPECT_FALSE(other.Speak);
     EXPECT_EQ(other.Voice, 2);  // nothing was learnt about the voices, so the setting stays
-}
-
-TEST_F(SpeakerTest, UseVoiceToggle) {
-    EXPECT_FALSE(ToggleVoice(options, true));
-    EXPECT_FALSE(options.Speak);
-    EXPECT_TRUE(ToggleVoice(options, false));
-    EXPECT_TRUE(options.Speak);
 }
 
 }  // namespace

@@ -1,6 +1,6 @@
 #pragma once
 #include <ctime>
-#include <memory>
+#include <string>
 
 #include "app/ActivityLog.h"
 #include "platform/Clock.h"
@@ -10,11 +10,13 @@
 
 namespace qv::test {
 
-// A real activity log in a temporary folder, for the reference tests.
+// Every log line carries the same time, so tests can compare whole lines.
+struct FixedClock final : Clock {
+    std::time_t Now() const override { return 1079537400; }
+};
+
+// A real, enabled activity log in a fresh temporary folder.
 struct LogFixture {
-    struct FixedClock final : Clock {
-        std::time_t Now() const override { return 1079537400; }
-    };
     TempDir dir;
     EnglishRegional regional;
     FixedClock clock;
