@@ -39,9 +39,9 @@ void ReadLibraryLine(MyClass& library, std::string_view line, std::string& key) 
     if (!entry) entry = library.Item(key);
     if (!entry) return;
     entry->RomFile = key;
-    if (columns.Has(1)) AssignWithoutQuotes(entry->Title, columns[1]);
-    if (columns.Has(2)) AssignWithoutQuotes(entry->Year, columns[2]);
-    if (columns.Has(3)) AssignWithoutQuotes(entry->Company, columns[3]);
+    if (columns.Has(1)) columns.AssignWithoutQuotes(entry->Title, 1);
+    if (columns.Has(2)) columns.AssignWithoutQuotes(entry->Year, 2);
+    if (columns.Has(3)) columns.AssignWithoutQuotes(entry->Company, 3);
     if (columns.Has(4)) entry->EmuWorking = LibraryFlag(columns[4]);
     if (columns.Has(5)) entry->EmuColors = LibraryFlag(columns[5]);
     if (columns.Has(6)) entry->EmuSound = LibraryFlag(columns[6]);
