@@ -20,18 +20,22 @@ bool WaitForEnd(PosixProcessLauncher& launcher, ProcessId id, int seconds = 10) 
 }
 }  // namespace
 
-TEST(PosixProcessLauncher, ArgumentsArriveVerbatimAndOutputIsRedirected) {
+TEST(PosixProcessLauncher, ArgumentsArriveVerbatimOutputIsRedirectedAndEndedProcessIsReaped) {
     TempDir dir;
     PosixProcessLauncher launcher;
     const auto log = dir / "logs" / "game.log";  // the folder does not exist yet
-    dir.Write("logs-old/x", "");
-    const ProcessId id = launcher.Start(
-        {TEST_EMULATOR_PATH, {"--classic", "a;b $(x).zip", "`id`", "*"}, log.string(), ""});
+    const ProcessId id = launcher.Start({TEST_EMULATOR_PATH,
+                                         {"--classic", "--seconds", "0.5", "a;b $(x).zip", "`id`", "*"},
+                                         log.string(), ""});
     ASSERT_GT(id, 0);
+    EXPECT_TRUE(launcher.IsRunning(id));
     ASSERT_TRUE(WaitForEnd(launcher, id));
+    // Reaped: the id no longer names a process (not even a zombie).
+    EXPECT_FALSE(std::filesystem::exists("/proc/" + std::to_string(id)));
+    EXPECT_FALSE(launcher.IsRunning(0));
     const std::string output = ReadAll(log);
     EXPECT_EQ(output.rfind("M.A.M.E. v0.78", 0), 0u) << output;
-    EXPECT_NE(output.find("arguments: [--classic] [a;b $(x).zip] [`id`] [*]"), std::string::npos)
+    EXPECT_NE(output.find("arguments: [--classic] [--seconds] [0.5] [a;b $(x).zip] [`id`] [*]"), std::string::npos)
         << output;
 }
 
@@ -49,20 +53,6 @@ TEST(PosixProcessLauncher, OutputIsTruncatedAndWorkingDirectoryApplies) {
     const std::string output = ReadAll(log);
     EXPECT_EQ(output.find('x'), std::string::npos);
     EXPECT_NE(output.find("Average FPS: 59.94"), std::string::npos) << output;
-}
-
-TEST(PosixProcessLauncher, RunningUntilEndedThenReaped) {
-    PosixProcessLauncher launcher;
-    TempDir dir;
-    const ProcessId id =
-        launcher.Start({TEST_EMULATOR_PATH, {"--seconds", "0.5"}, (dir / "o.log").string(), ""});
-    ASSERT_GT(id, 0);
-    EXPECT_TRUE(launcher.IsRunning(id));
-    ASSERT_TRUE(WaitForEnd(launcher, id));
-    // Reaped: the id no longer names a process (not even a zombie).
-    EXPECT_FALSE(launcher.IsRunning(id));
-    EXPECT_FALSE(std::filesystem::exists("/proc/" + std::to_string(id)));
-    EXPECT_FALSE(launcher.IsRunning(0));
 }
 
 TEST(PosixProcessLauncher, MissingProgramOrUnwritableOutputStartsNothing) {

@@ -5,7 +5,6 @@
 #include <QTextToSpeech>
 #include <gtest/gtest.h>
 
-
 #include "platform/qt/QtSpeechEngine.h"
 
 namespace qv {
@@ -41,12 +40,11 @@ TEST(QtSpeechEngineTest, FliteOffersVoicesAndSurvivesMissingAudio) {
     // Without an audio device the engine ends in its error state; saying more must then
     // report failure with a reason instead of pretending to speak.
     const bool first = engine.Say("Hey you!");
-    bool said = false;
     QElapsedTimer timer;
     timer.start();
     while (timer.elapsed() < 3000) QCoreApplication::processEvents(QEventLoop::AllEvents, 50);
     engine.Stop();
-    said = engine.Say("Would you like to play a game?");
+    const bool said = engine.Say("Would you like to play a game?");
     // Here (no audio device) the second text fails with the engine's reason; with a working
     // device it is spoken and there is no reason to give.
     EXPECT_EQ(said, engine.LastError().empty()) << "first say: " << first;
