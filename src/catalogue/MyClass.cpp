@@ -45,8 +45,16 @@ std::uint32_t KeyHash(std::string_view key) {
         h ^= h >> 29;
     }
     if (left > 0) {
+        // The last bytes without a call to memcpy: one load that overlaps bytes already hashed,
+        // shifted out, or byte by byte for short keys.
         std::uint64_t w = 0;
-        std::memcpy(&w, p, left);
+        if (key.size() >= 8) {
+            std::memcpy(&w, key.data() + key.size() - 8, 8);
+            w >>= (8 - left) * 8;
+        } else {
+            for (std::size_t i = 0; i < left; ++i)
+                w |= static_cast<std::uint64_t>(static_cast<unsigned char>(p[i])) << (8 * i);
+        }
         h = (h ^ FoldWord(w)) * 0x9e3779b97f4a7c15ull;
     }
     return static_cast<std::uint32_t>(Mix(h));
