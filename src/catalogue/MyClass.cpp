@@ -76,6 +76,13 @@ bool SameKey(std::string_view a, std::string_view b) {
     return true;
 }
 
+// Positions never reach the table's size (it is at most three quarters full), so they fit
+// in the bits that the mask covers.
+inline std::uint32_t SlotFor(std::uint32_t hash, std::size_t position, std::size_t mask) {
+    const auto positionBits = static_cast<std::uint32_t>(mask);
+    return (hash & ~positionBits) | static_cast<std::uint32_t>(position);
+}
+
 inline void PrefetchSlot(const void* address) {
 #if defined(__GNUC__) || defined(__clang__)
     __builtin_prefetch(address);
@@ -113,11 +120,13 @@ MyClass::Collection& MyClass::Inner() {
 const MyClass* MyClass::Find(std::string_view key, std::uint32_t hash, std::size_t& slot) const {
     const auto& slots = inner_->slots;
     const std::size_t mask = slots.size() - 1;
+    const auto positionBits = static_cast<std::uint32_t>(mask);
+    const std::uint32_t tag = hash & ~positionBits;
     for (slot = hash & mask;; slot = (slot + 1) & mask) {
-        const Collection::Slot& entry = slots[slot];
-        if (entry.position == 0) return nullptr;
-        if (entry.hash == hash) {
-            const MyClass* item = inner_->order[entry.position - 1];
+        const Collection::Slot entry = slots[slot];
+        if (entry == 0) return nullptr;
+        if ((entry & ~positionBits) == tag) {
+            const MyClass* item = inner_->order[(entry & positionBits) - 1];
             if (SameKey(item->key_, key)) return item;
         }
     }
@@ -138,8 +147,8 @@ void MyClass::RebuildIndex() {
     for (std::size_t i = 0; i < c.order.size(); ++i) {
         const std::uint32_t hash = KeyHash(c.order[i]->key_);
         std::size_t slot = hash & mask;
-        while (c.slots[slot].position != 0) slot = (slot + 1) & mask;
-        c.slots[slot] = Collection::Slot{hash, static_cast<std::uint32_t>(i + 1)};
+        while (c.slots[slot] != 0) slot = (slot + 1) & mask;
+        c.slots[slot] = SlotFor(hash, i + 1, mask);
     }
 }
 
@@ -225,7 +234,7 @@ MyClass* MyClass::Add(std::string key) {
     item->key_ = std::move(key);
     item->keySet_ = true;
     c.order.push_back(item);
-    c.slots[slot] = Collection::Slot{hash, static_cast<std::uint32_t>(c.order.size())};
+    c.slots[slot] = SlotFor(hash, c.order.size(), c.slots.size() - 1);
     return item;
 }
 

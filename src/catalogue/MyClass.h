@@ -112,15 +112,15 @@ private:
             std::size_t capacity = 0;
         };
         // Open addressing over positions in `order`; keys are compared with the items' own.
-        struct Slot {
-            std::uint32_t hash = 0;
-            std::uint32_t position = 0;  // 1-based; 0 = empty slot
-        };
+        // A slot holds the 1-based position in its low bits (as many as the table's size
+        // needs) and the high bits of the key's hash above them; 0 is an empty slot. Four
+        // bytes a slot keep the table of a large library small enough to stay in cache.
+        using Slot = std::uint32_t;
         std::vector<MyClass*> order;  // insertion order
         std::vector<Chunk> chunks;
         std::size_t usedInLastChunk = 0;
         std::vector<MyClass*> freed;  // destroyed items whose storage may be used again
-        std::vector<Slot> slots;      // size is a power of two, at most half full
+        std::vector<Slot> slots;      // size is a power of two, at most three quarters full
 
         Collection() = default;
         Collection(const Collection&) = delete;
