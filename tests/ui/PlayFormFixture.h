@@ -2,13 +2,19 @@
 #include <gtest/gtest.h>
 
 #include <QAction>
+#include <QApplication>
 #include <QBrush>
+#include <QLabel>
+#include <QTest>
+#include <QTreeView>
+#include <functional>
 #include <memory>
 #include <string>
 
 #include "app/OptionsFile.h"
 #include "catalogue/RomLibrary.h"
 #include "platform/Regional.h"
+#include "support/FixedLog.h"
 #include "support/ScriptedPrompt.h"
 #include "support/TempDir.h"
 #include "ui/GameTreeModel.h"
@@ -17,12 +23,6 @@
 #include "ui/TreePane.h"
 
 namespace qv::test {
-
-// A fixed clock: every log line carries the same time.
-class FixedClock final : public Clock {
-public:
-    std::time_t Now() const override { return 1079537400; }
-};
 
 // A home folder with a library, records and a ROM folder whose games show every colour and
 // icon of the tree, and a main window opened on it.
@@ -76,14 +76,30 @@ protected:
                "^qbert.zip\tQ*bert\t\tTrue\tFalse\t1982\tGottlieb\t\t\tFalse\t0\tNever\t\t0\r\n";
     }
 
-    // Reads the library and opens the window (the start-up's last steps).
-    PlayForm& Open() {
+    // Reads the library and opens the window (the start-up's last steps); `attach` adds the
+    // window's controllers before it loads.
+    PlayForm& Open(const std::function<void(PlayForm&)>& attach = {}) {
         NoStatusDisplay status;
         LoadRomLibrary(program.romLibrary, program.options.RomLibraryFile, *program.log, status);
         form = std::make_unique<PlayForm>(program, nullptr);
+        if (attach) attach(*form);
         form->Load();
         return *form;
     }
+
+    template <typename T = QWidget>
+    T* Control(const char* name) {
+        auto* control = form->findChild<T*>(QString::fromLatin1(name));
+        EXPECT_NE(control, nullptr) << name;
+        return control;
+    }
+    QString Text(const char* name) { return Control<QLabel>(name)->text(); }
+    bool Shown(const char* name) { return !Control(name)->isHidden(); }
+    void Click(const char* name) {
+        QApplication::processEvents();  // lay out the tabs so a click lands inside them
+        QTest::mouseClick(Control(name), Qt::LeftButton);
+    }
+    void Select(const std::string& key) { form->Pane().View()->setCurrentIndex(NodeIndex(key)); }
 
     GameTreeModel& Model() { return form->Pane().Model(); }
 

@@ -1,14 +1,9 @@
 #include <QListWidget>
 #include <QMenu>
 #include <QMenuBar>
-#include <QTest>
-#include <QTreeView>
-
-#include <QApplication>
 #include <QTimer>
 
 #include "PlayFormFixture.h"
-#include "ui/ClickLabel.h"
 #include "ui/HelpPages.h"
 #include "ui/HelpWindow.h"
 
@@ -64,58 +59,45 @@ TEST_F(PlayFormMenuTest, MenusHaveTheirCommandsInOrderAndUnbuiltOnesAreOff) {
                              "mInsertInfo", "mUpdateAll", "mDownloadRoms", "mViewHidden",
                              "mViewWorking", "mViewAll", "mFullScreen", "mNormal",
                              "mMinimize", "mHelp", "mMAMEHelp", "mAbout"})
-        Command(name);
+        EXPECT_NE(Command(name), nullptr);
 }
 
 TEST_F(PlayFormMenuTest, WithoutEditingTheEditingCommandsAreOffAndNotesAreOnlyViewed) {
     program.options.Edit = false;
-    Open();
-    EXPECT_FALSE(Command("mSave")->isEnabled());
-    EXPECT_FALSE(Command("mDelete")->isEnabled());
-    EXPECT_EQ(Command("mNotes")->text(), "View Game Notes");
-    EXPECT_TRUE(Command("mRefresh")->isEnabled());
-}
-
-TEST_F(PlayFormMenuTest, UseVoiceIsUncheckedWhenSpeechIsOff) {
     program.options.Speak = false;
     Open();
-    EXPECT_FALSE(Command("mVoice")->isChecked());
+    for (const char* off : {"mSave", "mDelete", "mRename"})
+        EXPECT_FALSE(Command(off)->isEnabled()) << off;
+    EXPECT_EQ(Command("mNotes")->text(), "View Game Notes");
+    EXPECT_TRUE(Command("mRefresh")->isEnabled());
+    EXPECT_FALSE(Command("mVoice")->isChecked());  // speech is off
 }
 
-TEST_F(PlayFormMenuTest, LogoClicksShowAndHideTheMenuBar) {
+TEST_F(PlayFormMenuTest, LogoClicksShowAndHideTheMenuBarAndDoubleClicksSpeak) {
     PlayForm& window = Open();
-    EXPECT_FALSE(window.MenuBarShown());
     EXPECT_TRUE(window.menuBar()->isHidden());
-    auto* logo = window.findChild<ClickLabel*>("Image3");
-    ASSERT_NE(logo, nullptr);
-    QTest::mouseClick(logo, Qt::LeftButton);
+    Click("Image3");
     EXPECT_TRUE(window.MenuBarShown());
     EXPECT_FALSE(window.menuBar()->isHidden());
-    QTest::mouseClick(logo, Qt::LeftButton);
-    EXPECT_FALSE(window.MenuBarShown());
+    Click("Image3");
     EXPECT_TRUE(window.menuBar()->isHidden());
-}
 
-TEST_F(PlayFormMenuTest, LogoDoubleClickAndCountLabelClickSpeak) {
-    PlayForm& window = Open();
     std::vector<std::string> spoken;
     window.Hooks().speak = [&](const std::string& text) { spoken.push_back(text); };
-    QTest::mouseDClick(window.findChild<ClickLabel*>("Image3"), Qt::LeftButton);
-    QTest::mouseClick(window.findChild<ClickLabel*>("Label15"), Qt::LeftButton);
-    ASSERT_EQ(spoken.size(), 2u);
-    EXPECT_EQ(spoken[0], "Quorvane! Version 2.25");
-    EXPECT_EQ(spoken[1], "8 ROMS (13 KB)");
+    QTest::mouseDClick(Control("Image3"), Qt::LeftButton);
+    Click("Label15");
+    EXPECT_EQ(spoken, (std::vector<std::string>{"Quorvane! Version 2.25", "8 ROMS (13 KB)"}));
 }
 
 TEST_F(PlayFormMenuTest, RightButtonOnTheCountLabelSwapsTreeAndFileList) {
     PlayForm& window = Open();
-    auto* tree = window.findChild<QTreeView*>("TreeView1");
-    auto* files = window.findChild<QListWidget*>("File1");
+    auto* tree = Control<QTreeView>("TreeView1");
+    auto* files = Control<QListWidget>("File1");
     ASSERT_NE(files, nullptr);
     EXPECT_FALSE(tree->isHidden());
     EXPECT_TRUE(files->isHidden());
 
-    QTest::mousePress(window.findChild<ClickLabel*>("Label15"), Qt::RightButton);
+    QTest::mousePress(Control("Label15"), Qt::RightButton);
     EXPECT_TRUE(tree->isHidden());
     EXPECT_FALSE(files->isHidden());
     QStringList names;
@@ -123,7 +105,7 @@ TEST_F(PlayFormMenuTest, RightButtonOnTheCountLabelSwapsTreeAndFileList) {
     EXPECT_EQ(names, (QStringList{"digdug.zip", "dkong.zip", "galaga.zip", "joust.zip",
                                   "mystery.zip", "pacman.zip", "qbert.zip", "readme.txt"}));
 
-    QTest::mousePress(window.findChild<ClickLabel*>("Label15"), Qt::RightButton);
+    QTest::mousePress(Control("Label15"), Qt::RightButton);
     EXPECT_FALSE(tree->isHidden());
     EXPECT_TRUE(files->isHidden());
 }
@@ -135,18 +117,6 @@ TEST_F(PlayFormMenuTest, FullScreenHidesTheMenusAndMinimizeMinimizes) {
     EXPECT_FALSE(window.MenuBarShown());
     Command("mMinimize")->trigger();
     EXPECT_TRUE(window.windowState() & Qt::WindowMinimized);
-}
-
-TEST_F(PlayFormMenuTest, DoubleClickOnAGameAsksToRunItButNotOnAFolder) {
-    PlayForm& window = Open();
-    std::vector<NodeId> started;
-    window.Hooks().runGame = [&](NodeId node) { started.push_back(node); };
-    auto* view = window.findChild<QTreeView*>("TreeView1");
-    emit view->doubleClicked(NodeIndex("Maze_"));
-    EXPECT_TRUE(started.empty());
-    emit view->doubleClicked(NodeIndex("alpha_pacman.zip"));
-    ASSERT_EQ(started.size(), 1u);
-    EXPECT_EQ(window.Tree().Node(started[0]).Tag, "pacman.zip");
 }
 
 TEST_F(PlayFormMenuTest, HelpReplacesTheMainWindowUntilItCloses) {

@@ -15,23 +15,17 @@ bool LogEndsWithSeparator(const std::string& log) {
                        kSeparator + "\r\n") == 0;
 }
 
-TEST_F(PlayFormQuitTest, TheQuitQuestionIsAskedWithYesAndNo) {
-    PlayForm& window = Open();
-    prompt->Answer(PromptAnswer::No);
-    window.close();
-    ASSERT_EQ(prompt->asked.size(), 1u);
-    EXPECT_EQ(prompt->asked[0].title, "Quorvane");
-    EXPECT_EQ(prompt->asked[0].text, "Are you sure you want to quit?");
-    EXPECT_EQ(prompt->asked[0].buttons, PromptButtons::YesNo);
-    EXPECT_EQ(prompt->asked[0].icon, PromptIcon::Question);
-}
-
-TEST_F(PlayFormQuitTest, NoKeepsTheWindowAndWritesNothing) {
+TEST_F(PlayFormQuitTest, TheQuitQuestionAnsweredNoKeepsTheWindowAndWritesNothing) {
     PlayForm& window = Open();
     QSignalSpy quits(&window, &PlayForm::quitConfirmed);
     const std::string logBefore = home.Read("quorvane.log");
     prompt->Answer(PromptAnswer::No);
     EXPECT_FALSE(window.close());
+    ASSERT_EQ(prompt->asked.size(), 1u);
+    EXPECT_EQ(prompt->asked[0].title, "Quorvane");
+    EXPECT_EQ(prompt->asked[0].text, "Are you sure you want to quit?");
+    EXPECT_EQ(prompt->asked[0].buttons, PromptButtons::YesNo);
+    EXPECT_EQ(prompt->asked[0].icon, PromptIcon::Question);
     EXPECT_TRUE(window.isVisible());
     EXPECT_EQ(quits.count(), 0);
     EXPECT_EQ(home.Read("games.inc"), GamesInc());
@@ -72,7 +66,7 @@ protected:
     }
 };
 
-TEST_F(FailingSaveTest, AFailedSaveOnExitShowsTheErrorAndNoKeepsTheWindow) {
+TEST_F(FailingSaveTest, AFailedSaveOnExitAsksWhetherToQuitWithoutSaving) {
     QSignalSpy quits(form.get(), &PlayForm::quitConfirmed);
     prompt->Answer(PromptAnswer::Yes);
     prompt->Answer(PromptAnswer::No);
@@ -84,11 +78,8 @@ TEST_F(FailingSaveTest, AFailedSaveOnExitShowsTheErrorAndNoKeepsTheWindow) {
     EXPECT_NE(prompt->asked[1].text.find("Quit without saving?"), std::string::npos);
     EXPECT_NE(home.Read("quorvane.log").find(" *** "), std::string::npos);
     EXPECT_FALSE(LogEndsWithSeparator(home.Read("quorvane.log")));
-}
 
-TEST_F(FailingSaveTest, AFailedSaveOnExitStillQuitsWhenTheUserAccepts) {
-    QSignalSpy quits(form.get(), &PlayForm::quitConfirmed);
-    prompt->Answer(PromptAnswer::Yes);
+    prompt->Answer(PromptAnswer::Yes);  // asked again, this time the user accepts
     prompt->Answer(PromptAnswer::Yes);
     EXPECT_TRUE(form->close());
     EXPECT_EQ(quits.count(), 1);

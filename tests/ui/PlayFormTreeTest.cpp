@@ -1,6 +1,3 @@
-#include <QLabel>
-#include <QTreeView>
-
 #include "PlayFormFixture.h"
 
 namespace qv::test {
@@ -45,14 +42,19 @@ TEST_F(PlayFormTreeTest, ColoursAndPicturesTellWorkingPresentAndScreenshot) {
     EXPECT_FALSE(NodeIndex("Maze_pacman.zip").data(Qt::DecorationRole).value<QIcon>().isNull());
 }
 
-TEST_F(PlayFormTreeTest, OpeningAFolderInTheViewShowsTheOpenFolder) {
-    PlayForm& window = Open();
-    QTreeView* view = window.findChild<QTreeView*>("TreeView1");
-    ASSERT_NE(view, nullptr);
+TEST_F(PlayFormTreeTest, OpenFoldersShowTheOpenFolderAndStayOpenWhenGamesAreAdded) {
+    Open();
+    QTreeView* view = Control<QTreeView>("TreeView1");
     view->expand(NodeIndex("Maze_"));
     EXPECT_EQ(PictureOf("Maze_"), "fopen");
     view->collapse(NodeIndex("Maze_"));
     EXPECT_EQ(PictureOf("Maze_"), "fclosed");
+
+    view->expand(NodeIndex("alpha_"));
+    Command("mViewAll")->trigger();
+    EXPECT_TRUE(view->isExpanded(NodeIndex("alpha_")));
+    EXPECT_EQ(PictureOf("alpha_"), "fopen");
+    EXPECT_FALSE(view->isExpanded(NodeIndex("MAME.ROMS")));
 }
 
 TEST_F(PlayFormTreeTest, HiddenGamesFilterFollowsItsCheckMark) {
@@ -101,16 +103,6 @@ TEST_F(PlayFormTreeTest, AddAllEmulatedGamesAddsTheLibraryOnce) {
     EXPECT_EQ(Model().rowCount(), 5);
 }
 
-TEST_F(PlayFormTreeTest, AddAllKeepsOpenFoldersOpen) {
-    PlayForm& window = Open();
-    QTreeView* view = window.findChild<QTreeView*>("TreeView1");
-    view->expand(NodeIndex("alpha_"));
-    Command("mViewAll")->trigger();
-    EXPECT_TRUE(view->isExpanded(NodeIndex("alpha_")));
-    EXPECT_EQ(PictureOf("alpha_"), "fopen");
-    EXPECT_FALSE(view->isExpanded(NodeIndex("MAME.ROMS")));
-}
-
 TEST_F(PlayFormTreeTest, RefreshReadsRecordsAndFolderAgain) {
     PlayForm& window = Open();
     Command("mViewAll")->trigger();
@@ -127,12 +119,10 @@ TEST_F(PlayFormTreeTest, RefreshReadsRecordsAndFolderAgain) {
 
 TEST_F(PlayFormTreeTest, CountLabelShowsArchivesAndTheirSize) {
     PlayForm& window = Open();
-    auto* label = window.findChild<QLabel*>("Label15");
-    ASSERT_NE(label, nullptr);
     // 7 lines of games.inc + mystery.zip; the archives counted and the readme's 10 bytes.
     EXPECT_EQ(window.Counts().RomCount, 8);
     EXPECT_EQ(window.Counts().RomBytes, 6 * 2048 + 10);  // the removed qbert.zip is skipped
-    EXPECT_EQ(label->text(), "8 ROMS (13 KB)");
+    EXPECT_EQ(Text("Label15"), "8 ROMS (13 KB)");
 }
 
 }  // namespace
