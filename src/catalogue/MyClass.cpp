@@ -118,12 +118,12 @@ MyClass::Collection& MyClass::Inner() {
 }
 
 const MyClass* MyClass::Find(std::string_view key, std::uint32_t hash, std::size_t& slot) const {
-    const auto& slots = inner_->slots;
-    const std::size_t mask = slots.size() - 1;
+    const auto& keyTable = inner_->keyTable;
+    const std::size_t mask = keyTable.size() - 1;
     const auto positionBits = static_cast<std::uint32_t>(mask);
     const std::uint32_t tag = hash & ~positionBits;
     for (slot = hash & mask;; slot = (slot + 1) & mask) {
-        const Collection::Slot entry = slots[slot];
+        const Collection::Slot entry = keyTable[slot];
         if (entry == 0) return nullptr;
         if ((entry & ~positionBits) == tag) {
             const MyClass* item = inner_->order[(entry & positionBits) - 1];
@@ -135,20 +135,20 @@ const MyClass* MyClass::Find(std::string_view key, std::uint32_t hash, std::size
 void MyClass::GrowIndex(std::size_t count) {
     std::size_t size = 16;
     while (size * 3 < count * 4) size *= 2;  // at most three quarters full
-    if (size <= inner_->slots.size()) return;
-    inner_->slots.resize(size);
+    if (size <= inner_->keyTable.size()) return;
+    inner_->keyTable.resize(size);
     RebuildIndex();
 }
 
 void MyClass::RebuildIndex() {
     Collection& c = *inner_;
-    std::fill(c.slots.begin(), c.slots.end(), Collection::Slot{});
-    const std::size_t mask = c.slots.size() - 1;
+    std::fill(c.keyTable.begin(), c.keyTable.end(), Collection::Slot{});
+    const std::size_t mask = c.keyTable.size() - 1;
     for (std::size_t i = 0; i < c.order.size(); ++i) {
         const std::uint32_t hash = KeyHash(c.order[i]->key_);
         std::size_t slot = hash & mask;
-        while (c.slots[slot] != 0) slot = (slot + 1) & mask;
-        c.slots[slot] = SlotFor(hash, i + 1, mask);
+        while (c.keyTable[slot] != 0) slot = (slot + 1) & mask;
+        c.keyTable[slot] = SlotFor(hash, i + 1, mask);
     }
 }
 
@@ -218,10 +218,10 @@ const MyClass* MyClass::Item(std::int32_t position) const {
 MyClass* MyClass::Add(std::string key) {
     Collection& c = Inner();
     const std::uint32_t hash = KeyHash(key);
-    if (c.slots.size() * 3 < (c.order.size() + 1) * 4) GrowIndex(c.order.size() + 1);
+    if (c.keyTable.size() * 3 < (c.order.size() + 1) * 4) GrowIndex(c.order.size() + 1);
     // The index slot is rarely in cache in a large collection: ask for it now and build the
     // new item meanwhile. A taken key (rare) gives the item's storage back.
-    PrefetchSlot(c.slots.data() + (hash & (c.slots.size() - 1)));
+    PrefetchSlot(c.keyTable.data() + (hash & (c.keyTable.size() - 1)));
     // Room first, so that a failed allocation cannot leave an item outside the order.
     if (c.order.size() == c.order.capacity()) c.order.reserve(c.order.capacity() * 2 + 16);
     MyClass* item = NewItem();
@@ -234,7 +234,7 @@ MyClass* MyClass::Add(std::string key) {
     item->key_ = std::move(key);
     item->keySet_ = true;
     c.order.push_back(item);
-    c.slots[slot] = SlotFor(hash, c.order.size(), c.slots.size() - 1);
+    c.keyTable[slot] = SlotFor(hash, c.order.size(), c.keyTable.size() - 1);
     return item;
 }
 

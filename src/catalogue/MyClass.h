@@ -120,7 +120,7 @@ private:
         std::vector<Chunk> chunks;
         std::size_t usedInLastChunk = 0;
         std::vector<MyClass*> freed;  // destroyed items whose storage may be used again
-        std::vector<Slot> slots;      // size is a power of two, at most three quarters full
+        std::vector<Slot> keyTable;   // size is a power of two, at most three quarters full
 
         Collection() = default;
         Collection(const Collection&) = delete;
