@@ -15,25 +15,13 @@
 #include "launch/PanelSpeech.h"
 #include "reference/MakeSpeakable.h"
 #include "reference/VoiceToggle.h"
+#include "ui/BusyCursor.h"
 #include "ui/DetailsPanel.h"
 #include "ui/PlayForm.h"
 #include "ui/Program.h"
 #include "ui/TreePane.h"
 
 namespace qv {
-
-namespace {
-
-// The hourglass for the length of one piece of work.
-class BusyCursor {
-public:
-    BusyCursor() { QApplication::setOverrideCursor(Qt::WaitCursor); }
-    ~BusyCursor() { QApplication::restoreOverrideCursor(); }
-    BusyCursor(const BusyCursor&) = delete;
-    BusyCursor& operator=(const BusyCursor&) = delete;
-};
-
-}  // namespace
 
 GameRoadController::GameRoadController(PlayForm& form, Program& program, SpeechEngine& engine,
                                        ProcessLauncher& launcher)

@@ -15,6 +15,7 @@
 #include "catalogue/GameTreeBuilder.h"
 #include "catalogue/RomLibrary.h"
 #include "ui/AboutWindow.h"
+#include "ui/BusyCursor.h"
 #include "ui/ClickLabel.h"
 #include "ui/HelpWindow.h"
 #include "ui/PlayFormStyle.h"
@@ -168,14 +169,13 @@ void PlayForm::RebuildTree() {
 
 void PlayForm::AddAllEmulatedGames() {
     if (tree_.Find("MAME.ROMS") != NoNode) return;
-    QApplication::setOverrideCursor(Qt::WaitCursor);
+    BusyCursor busy;
     ShowWait("Adding all MAME ROMs ... 0%");
     const SnapshotIndex snapshots(program_.options.SnapDir);
     pane_->ChangeTree([&] {
         qv::AddAllEmulatedGames(tree_, program_.romLibrary, program_.gameRecords, snapshots,
                                 Status(), *program_.yield);
     }, true);
-    QApplication::restoreOverrideCursor();
     CloseWait();
 }
 

@@ -8,6 +8,7 @@
 #include "app/TextFile.h"
 #include "launch/GameLog.h"
 #include "reference/CatalogueEditing.h"
+#include "ui/BusyCursor.h"
 #include "ui/DetailsTextEdit.h"
 #include "ui/GameRoadController.h"
 #include "ui/GameTreeModel.h"
@@ -18,18 +19,6 @@
 #include "ui/TreePane.h"
 
 namespace qv {
-namespace {
-
-class BusyPointer {
-public:
-    BusyPointer() { QApplication::setOverrideCursor(Qt::WaitCursor); }
-    ~BusyPointer() { QApplication::restoreOverrideCursor(); }
-    BusyPointer(const BusyPointer&) = delete;
-    BusyPointer& operator=(const BusyPointer&) = delete;
-};
-
-}  // namespace
-
 ReferenceController::ReferenceController(PlayForm& form, Program& program, ReferenceHooks hooks)
     : QObject(&form),
       form_(form),
@@ -123,7 +112,7 @@ void ReferenceController::GameShown(NodeId node, bool refreshText, bool withLog,
                                     bool refreshPictures) {
     const std::string key = NodeTag(node);
     if (refreshText) {
-        BusyPointer busy;
+        BusyCursor busy;
         if (area_.Marker == "Notes") notes_.ShowNotes(area_, key);
         else if (area_.Marker == "Hist") views_.ShowHistory(area_, key);
         else if (area_.Marker == "Info") views_.ShowMameInfo(area_, key);
@@ -158,7 +147,7 @@ void ReferenceController::ClickTab(ViewTab tab) {
     view_->ShowTextArea();
     std::string name = SelectedKey();
     if (name.empty()) name = NodeTag(CurrentNode());
-    BusyPointer busy;
+    BusyCursor busy;
     if (history) views_.ShowHistory(area_, name);
     else views_.ShowMameInfo(area_, name);
     RenderText();
@@ -247,7 +236,7 @@ void ReferenceController::InsertMameInformation() {
 
 void ReferenceController::UpdateAll() {
     CatalogueEdit edit = Edit();
-    BusyPointer busy;
+    BusyCursor busy;
     form_.Pane().ChangeTree([&] { UpdateAllFromLibrary(edit); }, false);
 }
 
