@@ -1,6 +1,8 @@
 #include "catalogue/GameRecords.h"
 
 #include <charconv>
+#include <cstdio>
+#include <filesystem>
 #include <limits>
 
 #include "app/TextFile.h"
@@ -11,6 +13,13 @@ namespace qv {
 namespace {
 
 constexpr std::size_t kRecordColumns = 14;
+
+bool IsReadableFile(const std::string& path) {
+    std::FILE* file = std::fopen(path.c_str(), "rb");
+    if (!file) return false;
+    std::fclose(file);
+    return true;
+}
 
 // A games.inc boolean: any letter case of "TRUE" is true, everything else false.
 bool RecordFlag(std::string_view text) {
@@ -214,7 +223,13 @@ std::string SaveGameRecords(const MyClass& records, const Options& options,
         content += LineToSave(record, regional);
         content += "\r\n";
     }
-    std::string error = WriteFileAtomically(options.GamesFile, content);
+    // A games.inc that exists but cannot be read (its permissions, say) was never loaded, so
+    // the records in memory are not the user's: replacing it would lose them all.
+    std::string error;
+    if (std::filesystem::exists(options.GamesFile) && !IsReadableFile(options.GamesFile))
+        error = "Cannot read " + options.GamesFile + "; it was left as it is.";
+    else
+        error = WriteFileAtomically(options.GamesFile, content);
     if (!error.empty()) log.LogError("PlayForm", "SaveGameRecords", PendingError{75, error});
     return error;
 }
