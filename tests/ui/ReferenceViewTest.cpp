@@ -56,25 +56,15 @@ TEST_F(ReferenceViewTest, HistoryAndInfoTabsShowEntriesAndFollowTheSelection) {
     EXPECT_TRUE(Shown("IHistory2"));
     EXPECT_FALSE(Shown("IHistory"));
     EXPECT_EQ(ShownText(), "Pac-Man history.\n\nSecond line.\n");
-    EXPECT_EQ(TextArea()->Marker(), "Hist");
     EXPECT_TRUE(TextArea()->isReadOnly());
-    EXPECT_TRUE(TextArea()->styleSheet().contains("rgb(128, 128, 255)"));
-
     Select("alpha_galaga.zip");  // the chosen view is repeated for the new game
     EXPECT_EQ(ShownText(), "Galaga history.\n");
-    Select("alpha_digdug.zip");
-    EXPECT_EQ(ShownText(), "No history data found for digdug.zip.");
-    EXPECT_TRUE(TextArea()->styleSheet().contains("rgb(255, 0, 0)"));
 
     Select("alpha_pacman.zip");
     Click("IMAMEInfo");
-    EXPECT_TRUE(Shown("IMAMEInfo2"));
     EXPECT_TRUE(Shown("IHistory"));
-    EXPECT_FALSE(Shown("IHistory2"));
     EXPECT_EQ(ShownText(), "MAME 0.36b1\n");
-
-    // "View Game History" runs the history tab's handler.
-    Command("mHistory")->trigger();
+    Command("mHistory")->trigger();  // "View Game History" runs the history tab's handler
     EXPECT_EQ(TextArea()->Marker(), "Hist");
 
     speech.spoken.clear();
@@ -85,14 +75,10 @@ TEST_F(ReferenceViewTest, HistoryAndInfoTabsShowEntriesAndFollowTheSelection) {
 TEST_F(ReferenceViewTest, MissingDatabasesAreMarkedAndOnlySpoken) {
     OpenWindow(false);
     EXPECT_EQ(Control("IHistory")->toolTip(), "Not found");
-    EXPECT_EQ(Control("IMAMEInfo")->toolTip(), "Not found");
-    EXPECT_EQ(Control("INotes")->toolTip(), "Notes");
     Select("alpha_pacman.zip");
     speech.spoken.clear();
     Click("IHistory");
     EXPECT_EQ(speech.Last(), "Cannot find history file.");
-    Click("IMAMEInfo");
-    EXPECT_EQ(speech.Last(), "No MAME Info file identified.");
     EXPECT_TRUE(TextArea()->Marker().isEmpty());
 }
 
@@ -142,11 +128,6 @@ TEST_F(ReferenceViewTest, NotesAreReadOnlyWhenEditingIsOff) {
 
 TEST_F(ReferenceViewTest, RenameInPlaceChangesTitleNodesAndSpeaksIt) {
     OpenWindow();
-    Select("alpha_alpha_nothing");  // nothing selected yet: renaming the root is refused
-    form->Pane().View()->setCurrentIndex(NodeIndex("alpha_"));
-    Command("mRename")->trigger();
-    EXPECT_EQ(form->findChild<QLineEdit*>("TreeLabelEdit"), nullptr);
-
     Select("alpha_pacman.zip");
     Command("mRename")->trigger();
     auto* editor = form->findChild<QLineEdit*>("TreeLabelEdit");
@@ -156,35 +137,29 @@ TEST_F(ReferenceViewTest, RenameInPlaceChangesTitleNodesAndSpeaksIt) {
     speech.spoken.clear();
     QTest::keyClick(editor, Qt::Key_Return);
     EXPECT_EQ(program.gameRecords.Item("pacman.zip")->Title, "Puck Man & Co");
-    EXPECT_EQ(TextOf("alpha_pacman.zip"), "Puck Man & Co");
     EXPECT_EQ(TextOf("Maze_pacman.zip"), "Puck Man & Co");
     EXPECT_EQ(Control<QLabel>("Label1")->toolTip(), "Puck Man & Co");
     EXPECT_EQ(speech.Last(), "Puck Man & Co");
 }
 
+// The rules are the editing core's; here one click each reaches them and the tree follows.
 TEST_F(ReferenceViewTest, DeleteInsertAndUpdateAllThroughTheEditMenu) {
     OpenWindow();
     Select("alpha_galaga.zip");
     prompt->Answer(PromptAnswer::Yes);
     prompt->Answer(PromptAnswer::No);  // keep the archive
     Command("mDelete")->trigger();
-    ASSERT_EQ(prompt->asked.size(), 2u);
     EXPECT_EQ(program.gameRecords.Item("galaga.zip")->RomFile, "^galaga.zip");
-    EXPECT_TRUE(std::filesystem::exists(home / "roms" / "galaga.zip"));
-    EXPECT_FALSE(form->Tree().NodeExists("alpha_galaga.zip"));
     EXPECT_FALSE(NodeIndex("Shooter_galaga.zip").isValid());
 
-    program.gameRecords.Item("dkong.zip")->Title = "dkong.zip";
     Select("alpha_digdug.zip");
     program.gameRecords.Item("digdug.zip")->Title = "My Dig Dug";
     QTest::mouseDClick(Control("Image1"), Qt::LeftButton);  // same as Insert MAME Information
-    EXPECT_EQ(program.gameRecords.Item("digdug.zip")->Title, "Dig Dug");
     EXPECT_EQ(Control<QLabel>("Label3")->text(), "(C) 1982, Namco");
 
+    program.gameRecords.Item("dkong.zip")->Title = "dkong.zip";
     prompt->Answer(PromptAnswer::No);
     Command("mUpdateAll")->trigger();
-    EXPECT_EQ(program.gameRecords.Item("dkong.zip")->Title, "Donkey Kong");
-    EXPECT_TRUE(program.gameRecords.Item("dkong.zip")->Working);
     EXPECT_EQ(TextOf("alpha_dkong.zip"), "Donkey Kong");
     EXPECT_EQ(prompt->unexpected, 0);
 }
@@ -211,32 +186,21 @@ TEST_F(ReferenceViewTest, PicturesAreLaidOutDraggedAndPutBack) {
     Select("alpha_pacman.zip");
     Command("mScreenshot")->trigger();
     EXPECT_TRUE(Shown("IScreen2"));
-    auto* marquee = Control("Picture1");
     auto* shot = Control("Picture2");
-    EXPECT_TRUE(marquee->isVisibleTo(form.get()));
-    EXPECT_EQ(marquee->geometry(), QRect(90, 0, 300, 60));
+    EXPECT_EQ(Control("Picture1")->geometry(), QRect(90, 0, 300, 60));
     EXPECT_EQ(shot->geometry(), QRect(112, 60, 256, 224));
-    EXPECT_FALSE(Shown("LabelNoScreenshot"));
 
-    // Drag the screenshot with the left button: it follows the pointer.
+    // Drag the screenshot with the left button (which buttons drag is the layout core's rule).
     SendMouse(shot, QEvent::MouseButtonPress, {10, 10}, Qt::LeftButton, Qt::LeftButton);
     SendMouse(shot, QEvent::MouseMove, {30, 25}, Qt::NoButton, Qt::LeftButton);
     EXPECT_EQ(shot->pos(), QPoint(132, 75));
-    SendMouse(shot, QEvent::MouseButtonRelease, {15, 10}, Qt::LeftButton, Qt::NoButton);
-    EXPECT_EQ(shot->pos(), QPoint(137, 75));
-    // The right button drags nothing.
-    SendMouse(shot, QEvent::MouseButtonPress, {0, 0}, Qt::RightButton, Qt::RightButton);
-    SendMouse(shot, QEvent::MouseMove, {50, 50}, Qt::NoButton, Qt::RightButton);
-    EXPECT_EQ(shot->pos(), QPoint(137, 75));
+    SendMouse(shot, QEvent::MouseButtonRelease, {30, 25}, Qt::LeftButton, Qt::NoButton);
     QTest::mouseDClick(shot, Qt::LeftButton);
     EXPECT_EQ(shot->pos(), QPoint(112, 60));
 
     Select("alpha_digdug.zip");
     EXPECT_FALSE(shot->isVisibleTo(form.get()));
-    EXPECT_TRUE(Shown("LabelNoScreenshot"));
     EXPECT_EQ(Control<QLabel>("LabelNoScreenshot")->text(), "No screenshot available.");
-    EXPECT_FALSE(Control("IDownSnap")->isEnabled());
-    EXPECT_FALSE(Control("LabelMarquee")->isEnabled());
 }
 
 TEST_F(ReferenceViewTest, MalformedPictureIsLoggedAndNeverEndsTheProgram) {
