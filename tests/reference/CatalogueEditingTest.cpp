@@ -45,20 +45,18 @@ struct Editing : test::LogFixture {
         AddRecord("pacman.zip", "Pac-Man", "Shooter,Classic");
         AddRecord("galaga.zip", "galaga.zip", "Classic,Shooter");
         AddRecord("shoot.zip", "Shoot Game", "Shoot");
-        MyClass* entry = library.Add("pacman.zip");
-        entry->RomFile = "pacman.zip";
-        entry->Title = "Pac-Man (Midway)";
-        entry->Company = "Namco";
-        entry->Year = "1980";
-        entry->Category = "Maze";
-        entry->EmuWorking = true;
-        entry = library.Add("galaga.zip");
-        entry->RomFile = "galaga.zip";
-        entry->Title = "Galaga";
-        entry->Company = "Namco";
-        entry->Year = "1981";
-        entry->EmuWorking = true;
+        AddEntry("pacman.zip", "Pac-Man (Midway)", "1980").Category = "Maze";
+        AddEntry("galaga.zip", "Galaga", "1981");
         Rebuild();
+    }
+    MyClass& AddEntry(const std::string& key, const std::string& title, const std::string& year) {
+        MyClass& entry = *library.Add(key);
+        entry.RomFile = key;
+        entry.Title = title;
+        entry.Company = "Namco";
+        entry.Year = year;
+        entry.EmuWorking = true;
+        return entry;
     }
     void AddRecord(const std::string& key, const std::string& title, const std::string& cats) {
         MyClass* record = records.Add(key);
@@ -74,17 +72,13 @@ struct Editing : test::LogFixture {
     }
 };
 
-TEST(EditingLabels, AlphabeticalRootCannotBeRenamed) {
+TEST(EditingLabels, RenamingAGameChangesRecordAndEveryNodeOfItButNotTheRoot) {
     Editing e;
     EXPECT_FALSE(CanEditLabel(e.tree, e.tree.Find("alpha_")));
-    EXPECT_TRUE(CanEditLabel(e.tree, e.tree.Find("alpha_pacman.zip")));
     EXPECT_TRUE(CanEditLabel(e.tree, e.tree.Find("Maze_")));
     EXPECT_FALSE(CanEditLabel(e.tree, NoNode));
-}
-
-TEST(EditingLabels, RenamingAGameChangesRecordAndEveryNodeOfIt) {
-    Editing e;
     const NodeId node = e.tree.Find("alpha_pacman.zip");
+    EXPECT_TRUE(CanEditLabel(e.tree, node));
     EXPECT_EQ(RenameGame(e.edit, node, "pacman.zip", "Puck Man"), "Puck Man");
     EXPECT_EQ(e.records.Item("pacman.zip")->Title, "Puck Man");
     EXPECT_EQ(e.tree.Node(e.tree.Find("alpha_pacman.zip")).Text, "Puck Man");
@@ -103,35 +97,32 @@ TEST(EditingLabels, RenamingACategoryKeepsLongerNamesIntact) {
     EXPECT_EQ(e.records.Item("galaga.zip")->Categories, "Classic,Blaster");
 }
 
-TEST(EditingDelete, GameWithoutArchiveIsAskedOnceAndDroppedCompletely) {
+TEST(EditingDelete, GameWithoutArchiveIsAskedOnceAndDroppedCompletelyUnlessDeclined) {
     Editing e;
-    e.prompt.Answer(PromptAnswer::Yes);
-    EXPECT_EQ(DeleteSelected(e.edit, "pacman.zip", e.tree.Find("alpha_pacman.zip")),
-              DeleteOutcome::GameDeleted);
-    ASSERT_EQ(e.prompt.asked.size(), 1u);
-    EXPECT_EQ(e.prompt.asked[0].text, "Are you sure you want to delete Pac-Man?");
-    EXPECT_EQ(e.prompt.asked[0].title, "Quorvane");
-    EXPECT_EQ(e.prompt.asked[0].buttons, PromptButtons::YesNo);
-    EXPECT_EQ(e.prompt.asked[0].icon, PromptIcon::Question);
-    EXPECT_FALSE(e.records.exists("pacman.zip"));
-    EXPECT_FALSE(e.tree.NodeExists("alpha_pacman.zip"));
-    EXPECT_FALSE(e.tree.NodeExists("Maze_pacman.zip"));
-}
-
-TEST(EditingDelete, DeclinedQuestionChangesNothing) {
-    Editing e;
-    const auto archive = e.Archive("pacman.zip");
     e.prompt.Answer(PromptAnswer::No);
     EXPECT_EQ(DeleteSelected(e.edit, "pacman.zip", e.tree.Find("alpha_pacman.zip")),
               DeleteOutcome::Declined);
     EXPECT_EQ(e.records.Item("pacman.zip")->RomFile, "pacman.zip");
     EXPECT_TRUE(e.tree.NodeExists("alpha_pacman.zip"));
-    EXPECT_TRUE(std::filesystem::exists(archive));
+
+    e.prompt.Answer(PromptAnswer::Yes);
+    EXPECT_EQ(DeleteSelected(e.edit, "pacman.zip", e.tree.Find("alpha_pacman.zip")),
+              DeleteOutcome::GameDeleted);
+    ASSERT_EQ(e.prompt.asked.size(), 2u);
+    EXPECT_EQ(e.prompt.asked[1].text, "Are you sure you want to delete Pac-Man?");
+    EXPECT_EQ(e.prompt.asked[1].buttons, PromptButtons::YesNo);
+    EXPECT_FALSE(e.records.exists("pacman.zip"));
+    EXPECT_FALSE(e.tree.NodeExists("alpha_pacman.zip"));
+    EXPECT_FALSE(e.tree.NodeExists("Maze_pacman.zip"));
 }
 
 TEST(EditingDelete, ArchiveOnDiskIsAskedAboutAndTheRecordIsMarkedRemoved) {
     Editing e;
     const auto pacman = e.Archive("pacman.zip");
+    e.prompt.Answer(PromptAnswer::No);  // declining the first question keeps the archive too
+    EXPECT_EQ(DeleteSelected(e.edit, "pacman.zip", NoNode), DeleteOutcome::Declined);
+    EXPECT_TRUE(std::filesystem::exists(pacman));
+    e.prompt.asked.clear();
     e.prompt.Answer(PromptAnswer::Yes);
     e.prompt.Answer(PromptAnswer::No);
     EXPECT_EQ(DeleteSelected(e.edit, "pacman.zip", NoNode), DeleteOutcome::GameMarkedRemoved);
@@ -207,8 +198,8 @@ TEST(EditingLibraryInfo, InsertCopiesTitleCompanyAndYear) {
     const LibraryInfoShown shown = InsertMameInformation(e.edit, "pacman.zip", node);
     EXPECT_TRUE(shown.copied);
     EXPECT_EQ(shown.makerLine, "(C) 1980, Namco");
-    EXPECT_EQ(e.records.Item("pacman.zip")->Title, "Pac-Man (Midway)");
-    EXPECT_EQ(e.records.Item("pacman.zip")->Year, "1980");
+    const MyClass& pacman = *e.records.Item("pacman.zip");
+    EXPECT_EQ(pacman.Title + "|" + pacman.Company + "|" + pacman.Year, "Pac-Man (Midway)|Namco|1980");
     EXPECT_EQ(e.tree.Node(node).Text, "Pac-Man (Midway)");
     EXPECT_FALSE(InsertMameInformation(e.edit, "shoot.zip", NoNode).copied);
     EXPECT_FALSE(InsertMameInformation(e.edit, "", NoNode).copied);
@@ -239,9 +230,7 @@ TEST(EditingLibraryInfo, UpdateAllInUnidentifiedModeOnlyTouchesFileNamedGames) {
 
 TEST(EditingLibraryInfo, UpdateAllSkipsLibraryNodesWithoutRecord) {
     Editing e;
-    MyClass* entry = e.library.Add("dkong.zip");
-    entry->RomFile = "dkong.zip";
-    entry->Title = "Donkey Kong";
+    e.AddEntry("dkong.zip", "Donkey Kong", "1981");
     NoEventYield yield;
     NoStatusDisplay status;
     AddAllEmulatedGames(e.tree, e.library, e.records, SnapshotIndex(), status, yield);
