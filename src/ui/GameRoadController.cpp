@@ -73,7 +73,6 @@ GameRoadController::GameRoadController(PlayForm& form, Program& program, SpeechE
 
     const MainMenus& menus = form.Menus();
     menus.mSafeMode->setCheckable(true);
-    menus.mSafeMode->setChecked(false);  // the mark starts cleared whatever the flag
     menus.mSafeMode->setEnabled(true);
     connect(menus.mSafeMode, &QAction::triggered, this, [this](bool checked) {
         safeMode_ = checked;
@@ -116,6 +115,8 @@ void GameRoadController::FinishLoad() {
     if (options.Joystick && !state_.joystick.on)
         switches_.Click(PanelSwitch::Joystick, tree, NoNode);
     safeMode_ = InitialSafeMode(options);
+    // The mark shows the flag from the start, so the first click turns it the other way.
+    form_.Menus().mSafeMode->setChecked(safeMode_);
     quiet_ = false;
 
     speaker_.SetReady(form_.SpeechReady());

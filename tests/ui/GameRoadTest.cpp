@@ -162,6 +162,17 @@ TEST_F(GameRoadTest, ResolutionExecutableAndSafeMode) {
     EXPECT_TRUE(road->SafeMode());
 }
 
+TEST_F(GameRoadTest, SafeModeMarkMatchesTheFlagSetAtStart) {
+    program.options.Windows2000XP = false;
+    OpenRoad();
+    QAction* safe = Command("mSafeMode");
+    EXPECT_TRUE(road->SafeMode());
+    EXPECT_TRUE(safe->isChecked());
+    safe->trigger();
+    EXPECT_FALSE(road->SafeMode());
+    EXPECT_FALSE(safe->isChecked());
+}
+
 TEST_F(GameRoadTest, UseVoiceSwitchesSpeechOffAndOn) {
     OpenRoad();
     QAction* voice = Command("mVoice");
