@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include "AppTestSupport.h"
+#include "support/FixedLog.h"
 #include "app/NetworkSwitch.h"
 #include "app/OptionsFile.h"
 

@@ -1,6 +1,6 @@
 #include <gtest/gtest.h>
 
-#include "AppTestSupport.h"
+#include "support/FixedLog.h"
 #include "app/AppVersion.h"
 #include "app/RunHeader.h"
 
