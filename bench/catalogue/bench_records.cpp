@@ -29,6 +29,15 @@ struct QuietLog {
     qv::ActivityLog log{qv::bench::BenchFolder() / "bench.log", regional, clock, yield};
 };
 
+// games.inc of 10,000 records and a ROM folder of 10,000 archives (500 of them new).
+qv::Options RecordsOptions() {
+    qv::Options options;
+    options.GamesFile = qv::bench::WriteGamesFile(qv::bench::BenchFolder(), kRecords).string();
+    options.DefaultROMdir =
+        qv::bench::WriteRomFolder(qv::bench::BenchFolder(), kRecords, 500).string();
+    return options;
+}
+
 // The floor for the library loader: the file's bytes read and its line ends found.
 void BM_ReadAndSplitLines45k(benchmark::State& state) {
     const std::string& path = LibraryFile();
@@ -57,12 +66,8 @@ void BM_LoadRomLibrary45k(benchmark::State& state) {
 }
 BENCHMARK(BM_LoadRomLibrary45k)->Unit(benchmark::kMillisecond);
 
-// games.inc of 10,000 records and a ROM folder of 10,000 archives (500 of them new).
 void BM_LoadGameRecords10k(benchmark::State& state) {
-    qv::Options options;
-    options.GamesFile = qv::bench::WriteGamesFile(qv::bench::BenchFolder(), kRecords).string();
-    options.DefaultROMdir =
-        qv::bench::WriteRomFolder(qv::bench::BenchFolder(), kRecords, 500).string();
+    qv::Options options = RecordsOptions();
     const qv::HostConventions host = qv::HostConventions::Posix();
     QuietLog quiet;
     qv::NoStatusDisplay status;
@@ -82,10 +87,7 @@ BENCHMARK(BM_LoadGameRecords10k)->Unit(benchmark::kMillisecond);
 
 // Saving 10,000 unchanged records (each compared with the line it was read from).
 void BM_SaveGameRecords10k(benchmark::State& state) {
-    qv::Options options;
-    options.GamesFile = qv::bench::WriteGamesFile(qv::bench::BenchFolder(), kRecords).string();
-    options.DefaultROMdir =
-        qv::bench::WriteRomFolder(qv::bench::BenchFolder(), kRecords, 500).string();
+    qv::Options options = RecordsOptions();
     const qv::HostConventions host = qv::HostConventions::Posix();
     QuietLog quiet;
     qv::NoStatusDisplay status;
